@@ -1,0 +1,206 @@
+#include "platform/base/res/ZyrRmCString.h"
+
+#include "platform/base/res/ZyrTextResources.h"
+#include "platform/host/ut/HsutFormat.h"
+
+#include <algorithm>
+#include <cstdarg>
+#include <cwchar>
+#include <locale>
+#include <map>
+
+namespace {
+
+std::wstring withoutMnemonics(const std::wstring& text) {
+    std::wstring out;
+    out.reserve(text.size());
+    for (size_t i = 0; i < text.size(); ++i) {
+        if (text[i] != L'&')
+            out += text[i];
+        else if (i + 1 < text.size() && text[i + 1] == L'&')
+            out += text[++i];
+    }
+    return out;
+}
+
+wchar_t foldClassic(wchar_t c) {
+    static const auto& ctype = std::use_facet<std::ctype<wchar_t>>(std::locale::classic());
+    return ctype.tolower(c);
+}
+
+int sign(long long value) { return value < 0 ? -1 : value > 0 ? 1 : 0; }
+
+// One positional argument of FormatMessage, formatted by its "!spec!" and taken off the list.
+std::wstring formatPositional(const std::wstring& spec, va_list& args) {
+    const std::wstring format = L"%" + spec;
+    const wchar_t conversion = spec.empty() ? L's' : spec.back();
+    const bool isLong = spec.find(L'l') != std::wstring::npos;
+    const bool isLongLong = spec.find(L"ll") != std::wstring::npos;
+    switch (conversion) {
+    case L'd':
+    case L'i':
+        if (isLongLong)
+            return hsutFormat(format.c_str(), va_arg(args, long long));
+        if (isLong)
+            return hsutFormat(format.c_str(), va_arg(args, long));
+        return hsutFormat(format.c_str(), va_arg(args, int));
+    case L'u':
+    case L'x':
+    case L'X':
+    case L'o':
+        if (isLongLong)
+            return hsutFormat(format.c_str(), va_arg(args, unsigned long long));
+        if (isLong)
+            return hsutFormat(format.c_str(), va_arg(args, unsigned long));
+        return hsutFormat(format.c_str(), va_arg(args, unsigned));
+    case L'c': return hsutFormat(format.c_str(), va_arg(args, wint_t));
+    case L'C': return hsutFormat(format.c_str(), va_arg(args, int));
+    case L'f':
+    case L'F':
+    case L'e':
+    case L'E':
+    case L'g':
+    case L'G': return hsutFormat(format.c_str(), va_arg(args, double));
+    case L'S': return hsutFormat(format.c_str(), va_arg(args, const char*));
+    case L's':
+        if (spec.find(L'h') != std::wstring::npos)
+            return hsutFormat(format.c_str(), va_arg(args, const char*));
+        return hsutFormat(format.c_str(), va_arg(args, const wchar_t*));
+    default: return hsutFormat(format.c_str(), va_arg(args, void*));
+    }
+}
+
+struct Insert {
+    size_t begin;
+    size_t end;
+    int index;
+};
+
+} // namespace
+
+ZyrRmCString::ZyrRmCString(const wchar_t* appName, unsigned int id, bool stripMnemonics) {
+    const std::wstring app = appName != nullptr ? appName : L"";
+    const std::wstring* text = ZyrTextResources::find(app, id);
+    if (text == nullptr)
+        m_text = ZyrTextResources::placeholder(app, id);
+    else
+        m_text = stripMnemonics ? withoutMnemonics(*text) : *text;
+}
+
+void ZyrRmCString::Format(const wchar_t* format, ...) {
+    va_list args;
+    va_start(args, format);
+    m_text = hsutVFormat(format, args);
+    va_end(args);
+}
+
+void ZyrRmCString::FormatMessage(const wchar_t* format, ...) {
+    const std::wstring pattern = format != nullptr ? format : L"";
+    // Literal runs are inserts with index 0.
+    std::vector<Insert> pieces;
+    std::map<int, std::wstring> specs;
+    size_t literal = 0;
+    for (size_t i = 0; i < pattern.size(); ++i) {
+        if (pattern[i] != L'%' || i + 1 >= pattern.size())
+            continue;
+        if (pattern[i + 1] == L'%') {
+            pieces.push_back({literal, i + 1, 0});
+            literal = ++i + 1;
+            continue;
+        }
+        if (!std::iswdigit(pattern[i + 1]))
+            continue;
+        size_t j = i + 1;
+        int index = 0;
+        while (j < pattern.size() && std::iswdigit(pattern[j]) && index < 100)
+            index = index * 10 + (pattern[j++] - L'0');
+        std::wstring spec = L"s";
+        if (j < pattern.size() && pattern[j] == L'!') {
+            const size_t close = pattern.find(L'!', j + 1);
+            if (close != std::wstring::npos) {
+                spec = pattern.substr(j + 1, close - j - 1);
+                j = close + 1;
+            }
+        }
+        if (index == 0)
+            continue;
+        specs.emplace(index, spec);
+        pieces.push_back({literal, i, 0});
+        pieces.push_back({i, j, index});
+        literal = j;
+        i = j - 1;
+    }
+    pieces.push_back({literal, pattern.size(), 0});
+
+    // Arguments come in the order of their numbers; a number that is skipped takes none.
+    std::map<int, std::wstring> values;
+    va_list args;
+    va_start(args, format);
+    for (const auto& [index, spec] : specs)
+        values[index] = formatPositional(spec, args);
+    va_end(args);
+
+    m_text.clear();
+    for (const Insert& piece : pieces)
+        m_text += piece.index == 0 ? pattern.substr(piece.begin, piece.end - piece.begin)
+                                   : values[piece.index];
+}
+
+int ZyrRmCString::Compare(const wchar_t* other) const {
+    return sign(std::wcscmp(m_text.c_str(), other != nullptr ? other : L""));
+}
+
+int ZyrRmCString::CompareNoCase(const wchar_t* other) const {
+    const wchar_t* a = m_text.c_str();
+    const wchar_t* b = other != nullptr ? other : L"";
+    for (;; ++a, ++b) {
+        const wchar_t fa = foldClassic(*a);
+        const wchar_t fb = foldClassic(*b);
+        if (fa != fb)
+            return fa < fb ? -1 : 1;
+        if (fa == L'\0')
+            return 0;
+    }
+}
+
+int ZyrRmCString::Find(wchar_t c, int start) const {
+    if (start < 0 || static_cast<size_t>(start) > m_text.size())
+        return -1;
+    const size_t at = m_text.find(c, static_cast<size_t>(start));
+    return at == std::wstring::npos ? -1 : static_cast<int>(at);
+}
+
+int ZyrRmCString::Find(const wchar_t* sub, int start) const {
+    if (sub == nullptr || start < 0 || static_cast<size_t>(start) > m_text.size())
+        return -1;
+    const size_t at = m_text.find(sub, static_cast<size_t>(start));
+    return at == std::wstring::npos ? -1 : static_cast<int>(at);
+}
+
+int ZyrRmCString::Replace(const wchar_t* from, const wchar_t* to) {
+    if (from == nullptr || *from == L'\0')
+        return 0;
+    const std::wstring pattern = from;
+    const std::wstring replacement = to != nullptr ? to : L"";
+    int count = 0;
+    for (size_t at = m_text.find(pattern); at != std::wstring::npos;
+         at = m_text.find(pattern, at + replacement.size())) {
+        m_text.replace(at, pattern.size(), replacement);
+        ++count;
+    }
+    return count;
+}
+
+ZyrRmCString ZyrRmCString::Left(int count) const {
+    return m_text.substr(0, static_cast<size_t>(std::max(count, 0)));
+}
+
+ZyrRmCString ZyrRmCString::Mid(int first, int count) const {
+    const size_t from = std::min(static_cast<size_t>(std::max(first, 0)), m_text.size());
+    return m_text.substr(from, count < 0 ? std::wstring::npos : static_cast<size_t>(count));
+}
+
+ZyrRmCString ZyrRmCString::Right(int count) const {
+    const size_t n = std::min(static_cast<size_t>(std::max(count, 0)), m_text.size());
+    return m_text.substr(m_text.size() - n);
+}

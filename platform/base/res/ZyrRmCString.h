@@ -1,0 +1,67 @@
+// The system string: wide characters, one code point each.
+#pragma once
+
+#include <string>
+#include <vector>
+
+class ZyrRmCString {
+public:
+    ZyrRmCString() = default;
+    ZyrRmCString(const wchar_t* text) : m_text(text != nullptr ? text : L"") {}
+    ZyrRmCString(std::wstring text) : m_text(std::move(text)) {}
+    // The text of a module's resource. With stripMnemonics the '&' that marks a menu mnemonic is
+    // dropped ("&&" stays as one '&'), for texts shown as plain labels such as column names. An
+    // unknown module or number gives a visible placeholder.
+    ZyrRmCString(const wchar_t* appName, unsigned int id, bool stripMnemonics);
+
+    int GetLength() const { return static_cast<int>(m_text.size()); }
+    bool IsEmpty() const { return m_text.empty(); }
+    void Empty() { m_text.clear(); }
+    const wchar_t* GetString() const { return m_text.c_str(); }
+    operator const wchar_t*() const { return m_text.c_str(); }
+    const std::wstring& str() const { return m_text; }
+    wchar_t GetAt(int index) const { return m_text.at(static_cast<size_t>(index)); }
+
+    // printf-style, with the host's wide conventions ("%s" wide, "%S" and "%hs" UTF-8).
+    void Format(const wchar_t* format, ...);
+    // Inserts arguments by position: "%1", "%2!d!", ... Without "!spec!" an argument is a wide
+    // string. "%%" is a percent sign. Arguments are passed in the order of their numbers.
+    void FormatMessage(const wchar_t* format, ...);
+
+    // Exact comparison by character value.
+    int Compare(const wchar_t* other) const;
+    // Comparison after folding case with the classic locale: only A-Z fold, so "Ä" and "ä" differ.
+    int CompareNoCase(const wchar_t* other) const;
+
+    // Position of the first occurrence at or after start, or -1.
+    int Find(wchar_t c, int start = 0) const;
+    int Find(const wchar_t* sub, int start = 0) const;
+    // Replaces every occurrence; returns how many were replaced. An empty pattern replaces nothing.
+    int Replace(const wchar_t* from, const wchar_t* to);
+
+    ZyrRmCString Left(int count) const;
+    ZyrRmCString Mid(int first, int count = -1) const;
+    ZyrRmCString Right(int count) const;
+
+    ZyrRmCString& operator+=(const ZyrRmCString& other) {
+        m_text += other.m_text;
+        return *this;
+    }
+    ZyrRmCString& operator+=(const wchar_t* other) {
+        m_text += other != nullptr ? other : L"";
+        return *this;
+    }
+    ZyrRmCString& operator+=(wchar_t c) {
+        m_text += c;
+        return *this;
+    }
+    friend ZyrRmCString operator+(ZyrRmCString left, const ZyrRmCString& right) { return left += right; }
+    friend bool operator==(const ZyrRmCString& a, const ZyrRmCString& b) { return a.m_text == b.m_text; }
+    friend bool operator==(const ZyrRmCString& a, const wchar_t* b) { return a.Compare(b) == 0; }
+    friend auto operator<=>(const ZyrRmCString& a, const ZyrRmCString& b) { return a.m_text <=> b.m_text; }
+
+private:
+    std::wstring m_text;
+};
+
+using ZyrRmCStringArray = std::vector<ZyrRmCString>;

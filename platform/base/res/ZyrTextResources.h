@@ -1,0 +1,22 @@
+// The process-wide registry of text resources: each module enters its table of texts by number
+// under its application name, and strings are built from (application, number).
+#pragma once
+
+#include <map>
+#include <string>
+
+class ZyrTextResources {
+public:
+    using Table = std::map<unsigned int, std::wstring>;
+
+    // Enters a module's table, replacing one registered before under the same name.
+    static void registerTable(const std::wstring& appName, Table table);
+    static void unregisterTable(const std::wstring& appName);
+    static bool hasTable(const std::wstring& appName);
+
+    // The wording, or null when the module or the number is unknown.
+    static const std::wstring* find(const std::wstring& appName, unsigned int id);
+
+    // What an unknown text reads as: visible, and naming what is missing.
+    static std::wstring placeholder(const std::wstring& appName, unsigned int id);
+};
