@@ -1,0 +1,4 @@
+// The opaque handle of a loaded module image.
+#pragma once
+
+using HsModuleHandle = void*;

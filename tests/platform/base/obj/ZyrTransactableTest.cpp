@@ -1,0 +1,72 @@
+// Transactions of an in-memory object: the copy in force, commit, abort and nesting.
+#include "platform/base/obj/ZyrTransactable.h"
+
+#include <gtest/gtest.h>
+
+namespace {
+
+class Settings : public ZyrTransactable {
+public:
+    int value = 0;
+    ZyrTransactable* clone() const override {
+        auto* copy = new Settings;
+        copy->value = value;
+        return copy;
+    }
+    void copyFrom(const ZyrTransactable* other) override {
+        if (const auto* settings = dynamic_cast<const Settings*>(other))
+            value = settings->value;
+    }
+    // Writers work on whatever copy is in force, as forwarders of a transactable object do.
+    void set(int v) { static_cast<Settings*>(instance())->value = v; }
+    int get() const { return static_cast<const Settings*>(instance())->value; }
+};
+
+TEST(ZyrTransactable, endKeepsAndAbortDropsWhatTheTransactionChanged) {
+    Settings settings;
+    settings.set(1);
+    EXPECT_EQ(settings.instance(), &settings) << "outside a transaction the object is in force";
+
+    settings.startTransaction();
+    EXPECT_NE(settings.instance(), &settings);
+    settings.set(2);
+    EXPECT_EQ(settings.value, 1) << "the object itself is untouched while the copy is in force";
+    EXPECT_EQ(settings.get(), 2);
+    settings.abortTransaction();
+    EXPECT_EQ(settings.get(), 1);
+
+    settings.startTransaction();
+    settings.set(3);
+    settings.endTransaction();
+    EXPECT_EQ(settings.get(), 3);
+    EXPECT_EQ(settings.value, 3);
+    EXPECT_EQ(settings.transactionDepth(), 0);
+}
+
+TEST(ZyrTransactable, nestedTransactionsCommitIntoTheirOuterOne) {
+    Settings settings;
+    settings.set(1);
+    settings.startTransaction();
+    settings.set(2);
+    settings.startTransaction();
+    settings.set(3);
+    settings.endTransaction();
+    EXPECT_EQ(settings.get(), 3) << "the inner commit lands in the outer copy";
+    EXPECT_EQ(settings.value, 1);
+    settings.abortTransaction();
+    EXPECT_EQ(settings.get(), 1) << "aborting the outer one drops the inner commit too";
+
+    settings.endTransaction();
+    settings.abortTransaction();
+    EXPECT_EQ(settings.get(), 1) << "ending or aborting without a transaction changes nothing";
+}
+
+TEST(ZyrTransactable, copiesOfRunningTransactionsDieWithTheObject) {
+    auto* settings = new Settings;
+    settings->startTransaction();
+    settings->startTransaction();
+    EXPECT_EQ(settings->transactionDepth(), 2);
+    delete settings; // the sanitizer build reports a leak if the copies survive
+}
+
+} // namespace
