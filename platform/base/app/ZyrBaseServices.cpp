@@ -1,0 +1,50 @@
+#include "platform/base/app/ZyrBaseServices.h"
+
+#include "platform/host/rx/HsRxClass.h"
+#include "platform/host/rx/HsRxDynamicLinker.h"
+#include "platform/host/rx/HsRxSysRegistry.h"
+#include "platform/host/rx/HsRxDictionary.h"
+
+HSRX_DEFINE_MEMBERS(ZyrBaseServices, HsRxService, 0, nullptr)
+
+namespace {
+
+ZyrBaseServices* gService = nullptr;
+
+HsRxDynamicLinker* linker() {
+    return HsRxDynamicLinker::cast(hsrxSysRegistry()->at(kHsRxDynamicLinker));
+}
+
+} // namespace
+
+ZyrBaseServices* ZyrBaseServices::service() { return gService; }
+
+Hsys::ErrorStatus ZyrBaseServices::registerService(ZyrAppHdx* app) {
+    if (app == nullptr)
+        return Hsys::eNullPointer;
+    if (gService == nullptr) {
+        auto* created = new ZyrBaseServices;
+        const Hsys::ErrorStatus status = linker()->registerService(kServiceName, created);
+        if (status != Hsys::eSuccess) {
+            delete created;
+            return status;
+        }
+        gService = created;
+    }
+    gService->addDependency();
+    return Hsys::eSuccess;
+}
+
+Hsys::ErrorStatus ZyrBaseServices::unRegisterService(ZyrAppHdx* app) {
+    if (app == nullptr)
+        return Hsys::eNullPointer;
+    if (gService == nullptr)
+        return Hsys::eDoesNotApply;
+    gService->removeDependency();
+    if (!gService->unloadable())
+        return Hsys::eSuccess;
+    linker()->unregisterService(kServiceName);
+    delete gService;
+    gService = nullptr;
+    return Hsys::eSuccess;
+}
