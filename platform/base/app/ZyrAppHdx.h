@@ -42,6 +42,8 @@ public:
     const ZyrRmCString& appName() const { return m_appName; }
     const ZyrRmCString& moduleName() const { return m_moduleName; }
     HsModuleHandle module() const { return m_module; }
+    // The module's extension record, as the loader filled it at attach.
+    const AFX_EXTENSION_MODULE& extension() const { return m_extension; }
     // The host's pointer for this application, known from the init message on.
     void* hsysAppPtr() const { return m_hsysAppPtr; }
     bool isRunning() const { return m_running; }

@@ -59,6 +59,7 @@ TEST(ZyrAppHdx, entryPointBringsTheModuleUpAndDownInOrder) {
     TestApp app(gModule);
     EXPECT_EQ(app.appName(), L"TestApp80");
     EXPECT_EQ(app.hsysAppPtr(), nullptr);
+    EXPECT_EQ(&app.extension(), &gExtension);
 
     EXPECT_EQ(app.entryPoint(HsRx::kInitAppMsg, &gHostApp), HsRx::eOk);
     EXPECT_EQ(app.hsysAppPtr(), &gHostApp);
