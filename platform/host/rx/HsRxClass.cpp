@@ -20,6 +20,15 @@ bool HsRxClass::isDerivedFrom(const HsRxClass* other) const {
     return false;
 }
 
+HsRx::Ordering HsRxClass::comparedTo(const HsRxObject* other) const {
+    const HsRxClass* cls = HsRxClass::cast(other);
+    if (cls == nullptr)
+        return HsRx::eNotOrderable;
+    if (cls == this)
+        return HsRx::eEqual;
+    return m_reg.name < cls->m_reg.name ? HsRx::eLessThan : HsRx::eGreaterThan;
+}
+
 HsRxObject* HsRxClass::create() const {
     return m_reg.constructor != nullptr ? m_reg.constructor() : nullptr;
 }

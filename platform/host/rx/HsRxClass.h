@@ -28,6 +28,10 @@ public:
 
     explicit HsRxClass(Registration registration);
 
+    // Classes are ordered by name; eEqual only for the very same class, eNotOrderable against an
+    // object that is no class.
+    HsRx::Ordering comparedTo(const HsRxObject* other) const override;
+
     const wchar_t* name() const { return m_reg.name.c_str(); }
     HsRxClass* myParent() const { return m_reg.parent; }
     // True for the class itself and for every class below it; false for null.

@@ -57,6 +57,15 @@ TEST(HsRxClass, derivationFollowsParentsAcrossThreeLevels) {
     EXPECT_STREQ(Puppy::desc()->name(), L"Puppy");
 }
 
+TEST(HsRxClass, comparedToIsEqualOnlyForTheVeryClass) {
+    EXPECT_EQ(Dog::desc()->comparedTo(Dog::desc()), HsRx::eEqual);
+    EXPECT_EQ(Puppy::desc()->comparedTo(Dog::desc()), HsRx::eGreaterThan) << "a derived class differs";
+    EXPECT_EQ(Dog::desc()->comparedTo(Puppy::desc()), HsRx::eLessThan);
+    Dog dog;
+    EXPECT_EQ(Dog::desc()->comparedTo(&dog), HsRx::eNotOrderable);
+    EXPECT_EQ(Dog::desc()->comparedTo(nullptr), HsRx::eNotOrderable);
+}
+
 TEST(HsRxClass, castAnswersNullForNullAndForUnrelatedClasses) {
     Puppy puppy;
     Cat cat;

@@ -1,0 +1,4 @@
+// The process-wide geometry tolerance.
+#include "platform/host/ge/HsGeContext.h"
+
+HsGeTol HsGeContext::gTol;

@@ -1,0 +1,332 @@
+// Drawing files: a database saved and read back whole, proxies written back byte for byte,
+// damaged and foreign files refused with nothing left behind, and saves that are atomic.
+#include "platform/host/file/HsDbDrawingFile.h"
+#include "platform/host/db/HsDbBlockTable.h"
+#include "platform/host/db/HsDbDatabase.h"
+#include "platform/host/db/HsDbDictionary.h"
+#include "platform/host/db/HsDbObjectPointer.h"
+#include "platform/host/db/HsDbProxyObject.h"
+#include "platform/host/db/HsDbTextStyleTable.h"
+#include "tests/platform/host/db/HsDbTestGadget.h"
+
+#include <gtest/gtest.h>
+#include <sqlite3.h>
+
+#include <chrono>
+#include <csignal>
+#include <filesystem>
+#include <fstream>
+#include <map>
+#include <sys/wait.h>
+#include <unistd.h>
+
+namespace {
+
+namespace fs = std::filesystem;
+using Bytes = std::vector<std::uint8_t>;
+
+// The rows of a drawing file as they lie on disk: handle to class name and bytes.
+std::map<std::int64_t, std::pair<std::string, Bytes>> rowsOf(const fs::path& path) {
+    std::map<std::int64_t, std::pair<std::string, Bytes>> rows;
+    sqlite3* db = nullptr;
+    sqlite3_open_v2(path.c_str(), &db, SQLITE_OPEN_READONLY, nullptr);
+    sqlite3_stmt* query = nullptr;
+    sqlite3_prepare_v2(db, "SELECT handle, class, data FROM objects", -1, &query, nullptr);
+    while (sqlite3_step(query) == SQLITE_ROW) {
+        const auto* data = static_cast<const std::uint8_t*>(sqlite3_column_blob(query, 2));
+        rows[sqlite3_column_int64(query, 0)] = {
+            reinterpret_cast<const char*>(sqlite3_column_text(query, 1)),
+            Bytes(data, data + sqlite3_column_bytes(query, 2))};
+    }
+    sqlite3_finalize(query);
+    sqlite3_close(db);
+    return rows;
+}
+
+void executeSql(const fs::path& path, const char* sql) {
+    sqlite3* db = nullptr;
+    ASSERT_EQ(sqlite3_open(path.c_str(), &db), SQLITE_OK);
+    EXPECT_EQ(sqlite3_exec(db, sql, nullptr, nullptr, nullptr), SQLITE_OK) << sqlite3_errmsg(db);
+    sqlite3_close(db);
+}
+
+class HsDbDrawingFileTest : public testing::Test {
+protected:
+    void SetUp() override {
+        directory = fs::temp_directory_path() /
+                    ("hsdb-drawing-" + std::to_string(::getpid()) + "-" +
+                     testing::UnitTest::GetInstance()->current_test_info()->name());
+        fs::remove_all(directory);
+        fs::create_directories(directory);
+        path = directory / "plan.zyr";
+    }
+    void TearDown() override { fs::remove_all(directory); }
+
+    // A gadget in model space, with a label, as the plan's next room.
+    HsDbObjectId addGadget(HsDbDatabase& db, const wchar_t* label) {
+        HsDbObjectPointer<HsDbBlockTableRecord> space(db.modelSpaceId(), HsDb::kForWrite);
+        auto* gadget = new TestGadget;
+        gadget->label = label;
+        HsDbObjectId id;
+        EXPECT_EQ(space->appendHsDbEntity(id, gadget), Hsys::eSuccess);
+        gadget->close();
+        return id;
+    }
+
+    Hsys::ErrorStatus save(HsDbDatabase& db) { return db.saveAs(path.wstring().c_str()); }
+    Hsys::ErrorStatus load(HsDbDatabase& db, std::wstring* reason = nullptr) {
+        return db.readDrawingFile(path.wstring().c_str(), reason);
+    }
+
+    fs::path directory;
+    fs::path path;
+};
+
+TEST_F(HsDbDrawingFileTest, aSavedDatabaseLoadsWithTheSameObjectsFieldsAndReferences) {
+    HsDbDatabase original;
+    original.setDrawingUnits(HsDb::kUnitsCentimeters);
+    ASSERT_EQ(original.setDisplayPrecision(3), Hsys::eSuccess);
+    const HsDbObjectId kitchen = addGadget(original, L"K\u00fcche");
+    const HsDbObjectId hall = addGadget(original, L"Flur");
+    const HsDbObjectId storeroom = addGadget(original, L"Abstellraum");
+    {
+        HsDbObjectPointer<TestGadget> gadget(kitchen, HsDb::kForWrite);
+        gadget->partner = hall;
+        gadget->neighbours = {hall, storeroom, HsDbObjectId()};
+        gadget->names = {L"EG", L"Nord"};
+        gadget->length = 12.25;
+        HsDbObjectPointer<TestGadget> erased(storeroom, HsDb::kForWrite);
+        ASSERT_EQ(erased->erase(), Hsys::eSuccess);
+    }
+    HsDbObjectId styles;
+    HsDbObjectId standardStyle;
+    {
+        HsDbObjectPointer<HsDbDictionary> named(original.namedObjectsDictionaryId(),
+                                                HsDb::kForWrite);
+        HsDbObjectPointer<HsDbDictionary> sub(new HsDbDictionary);
+        ASSERT_EQ(named->setAt(L"ZYR_AREA_STYLES", sub.object(), styles), Hsys::eSuccess);
+        HsDbObjectPointer<TestGadget> record(new TestGadget);
+        ASSERT_EQ(sub->setAt(L"Standard", record.object(), standardStyle), Hsys::eSuccess);
+    }
+    ASSERT_EQ(save(original), Hsys::eSuccess);
+
+    HsDbDatabase loaded(HsDb::kEmptyDatabase);
+    std::wstring reason;
+    ASSERT_EQ(load(loaded, &reason), Hsys::eSuccess) << reason;
+    const wchar_t* fileName = nullptr;
+    loaded.getFilename(fileName);
+    EXPECT_EQ(fs::path(fileName), path);
+    EXPECT_EQ(loaded.drawingUnits(), HsDb::kUnitsCentimeters);
+    EXPECT_EQ(loaded.displayPrecision(), 3);
+    EXPECT_EQ(loaded.modelSpaceId().handle(), original.modelSpaceId().handle());
+    EXPECT_EQ(loaded.currentLayerId().handle(), original.currentLayerId().handle());
+
+    auto sameIn = [&loaded](const HsDbObjectId& id) {
+        HsDbObjectId found;
+        EXPECT_EQ(loaded.getHsDbObjectId(found, false, id.handle()), Hsys::eSuccess);
+        return found;
+    };
+    HsDbObjectPointer<HsDbBlockTableRecord> space(loaded.modelSpaceId(), HsDb::kForRead);
+    ASSERT_EQ(space.openStatus(), Hsys::eSuccess);
+    EXPECT_EQ(space->entityIds(),
+              (std::vector<HsDbObjectId>{sameIn(kitchen), sameIn(hall), sameIn(storeroom)}));
+    EXPECT_TRUE(sameIn(storeroom).isErased());
+
+    HsDbObjectPointer<TestGadget> gadget(sameIn(kitchen), HsDb::kForRead);
+    ASSERT_EQ(gadget.openStatus(), Hsys::eSuccess);
+    EXPECT_EQ(gadget->label, L"K\u00fcche");
+    EXPECT_EQ(gadget->length, 12.25);
+    EXPECT_EQ(gadget->names, (std::vector<std::wstring>{L"EG", L"Nord"}));
+    EXPECT_EQ(gadget->partner, sameIn(hall));
+    EXPECT_EQ(gadget->partner.database(), &loaded);
+    EXPECT_EQ(gadget->neighbours,
+              (std::vector<HsDbObjectId>{sameIn(hall), sameIn(storeroom), HsDbObjectId()}));
+    EXPECT_EQ(gadget->ownerId(), loaded.modelSpaceId());
+    EXPECT_EQ(gadget->layerId(), loaded.currentLayerId());
+
+    HsDbObjectPointer<HsDbDictionary> named(loaded.namedObjectsDictionaryId(), HsDb::kForRead);
+    HsDbObjectId loadedStyles;
+    ASSERT_EQ(named->getAt(L"zyr_area_styles", loadedStyles), Hsys::eSuccess);
+    HsDbObjectPointer<HsDbDictionary> sub(loadedStyles, HsDb::kForRead);
+    HsDbObjectId loadedStandard;
+    ASSERT_EQ(sub->getAt(L"STANDARD", loadedStandard), Hsys::eSuccess);
+    EXPECT_EQ(loadedStandard, sameIn(standardStyle));
+    EXPECT_EQ(loadedStandard.objectClass(), TestGadget::desc());
+
+    HsDbObjectId added;
+    ASSERT_EQ(loaded.addHsDbObject(added, new TestGadget), Hsys::eSuccess);
+    EXPECT_GT(added.handle(), standardStyle.handle()) << "new handles never reuse loaded ones";
+    HsDbObjectPointer<HsDbObject>(added, HsDb::kForRead);
+}
+
+TEST_F(HsDbDrawingFileTest, unknownClassesAndLaterVersionsComeBackByteForByte) {
+    HsDbDatabase original;
+    const HsDbObjectId current = addGadget(original, L"heute");
+    const HsDbObjectId later = addGadget(original, L"morgen");
+    const HsDbObjectId foreign = addGadget(original, L"fremd");
+    {
+        HsDbObjectPointer<TestGadget> gadget(current, HsDb::kForWrite);
+        gadget->partner = later;
+    }
+    ASSERT_EQ(save(original), Hsys::eSuccess);
+    // Written as a later version would write it, and with a class this build never had.
+    TestGadget::versionToWrite = 81;
+    {
+        HsDbObjectPointer<TestGadget> gadget(later, HsDb::kForRead);
+        HsDbBdfFiler filer(&original);
+        ASSERT_EQ(gadget->bdfOut(&filer), Hsys::eSuccess);
+        sqlite3* db = nullptr;
+        ASSERT_EQ(sqlite3_open(path.c_str(), &db), SQLITE_OK);
+        sqlite3_stmt* update = nullptr;
+        sqlite3_prepare_v2(db, "UPDATE objects SET data = ? WHERE handle = ?", -1, &update,
+                           nullptr);
+        sqlite3_bind_blob(update, 1, filer.bytes().data(), static_cast<int>(filer.bytes().size()),
+                          SQLITE_STATIC);
+        sqlite3_bind_int64(update, 2, static_cast<sqlite3_int64>(later.handle()));
+        EXPECT_EQ(sqlite3_step(update), SQLITE_DONE);
+        sqlite3_finalize(update);
+        sqlite3_close(db);
+    }
+    TestGadget::versionToWrite = TestGadget::kCurrentVersion;
+    executeSql(path, ("UPDATE objects SET class = 'ZyrDbFromTheFuture' WHERE handle = " +
+                      std::to_string(foreign.handle()))
+                         .c_str());
+    const auto before = rowsOf(path);
+
+    HsDbDatabase loaded(HsDb::kEmptyDatabase);
+    std::wstring reason;
+    ASSERT_EQ(load(loaded, &reason), Hsys::eSuccess) << reason;
+    HsDbObjectId laterId;
+    HsDbObjectId foreignId;
+    loaded.getHsDbObjectId(laterId, false, later.handle());
+    loaded.getHsDbObjectId(foreignId, false, foreign.handle());
+    EXPECT_EQ(laterId.objectClass(), HsDbProxyObject::desc());
+    EXPECT_EQ(foreignId.objectClass(), HsDbProxyObject::desc());
+    {
+        HsDbObjectPointer<HsDbProxyObject> proxy(foreignId, HsDb::kForRead);
+        EXPECT_EQ(proxy->originalClassName(), L"ZyrDbFromTheFuture");
+        EXPECT_EQ(proxy->ownerId(), loaded.modelSpaceId());
+        HsDbObjectPointer<TestGadget> gadget(laterId, HsDb::kForRead);
+        EXPECT_EQ(gadget.openStatus(), Hsys::eWrongClass);
+    }
+
+    fs::remove(path);
+    ASSERT_EQ(save(loaded), Hsys::eSuccess);
+    EXPECT_EQ(rowsOf(path), before) << "every row, proxies included, as it was read";
+}
+
+TEST_F(HsDbDrawingFileTest, damagedAndForeignFilesAreRefusedAndLeaveTheDatabaseEmpty) {
+    HsDbDatabase original;
+    const HsDbObjectId gadget = addGadget(original, L"Bad");
+    ASSERT_EQ(save(original), Hsys::eSuccess);
+    const fs::path good = directory / "good.zyr";
+    fs::copy_file(path, good);
+
+    struct Case {
+        std::string sql;
+        Hsys::ErrorStatus expected;
+        const wchar_t* because;
+    };
+    const std::string row = " WHERE handle = " + std::to_string(gadget.handle());
+    const Case cases[] = {
+        {"UPDATE objects SET data = substr(data, 1, 12)" + row, Hsys::eBadDrawingFile,
+         L"cannot be read (eFilerError)"},
+        {"UPDATE objects SET data = CAST(data || x'00' AS BLOB)" + row, Hsys::eBadDrawingFile,
+         L"cannot be read (eFilerError)"},
+        {"UPDATE objects SET data = 'text'" + row, Hsys::eBadDrawingFile, L"a flag and bytes"},
+        {"UPDATE objects SET handle = -5" + row, Hsys::eBadDrawingFile, L"a flag and bytes"},
+        {"UPDATE objects SET class = CAST(x'C0AF' AS TEXT)" + row, Hsys::eBadDrawingFile,
+         L"not UTF-8"},
+        {"ALTER TABLE objects RENAME TO old; CREATE TABLE objects(handle, class, erased, data);"
+         "INSERT INTO objects SELECT * FROM old; INSERT INTO objects SELECT * FROM old" +
+             row + "; DROP TABLE old",
+         Hsys::eBadDrawingFile, L"used twice"},
+        {"UPDATE header SET value = 999 WHERE key = 'modelSpace'", Hsys::eBadDrawingFile,
+         L"\"modelSpace\" names no HsDbBlockTableRecord"},
+        {"UPDATE header SET value = 77 WHERE key = 'drawingUnits'", Hsys::eBadDrawingFile,
+         L"names no unit"},
+        {"DELETE FROM header WHERE key = 'layerTable'", Hsys::eBadDrawingFile,
+         L"lacks \"layerTable\""},
+        {"UPDATE header SET value = 2 WHERE key = 'format'", Hsys::eNewerVersion, L"later version"},
+        {"PRAGMA application_id = 1", Hsys::eBadDrawingFile, L"another application"},
+        {"DROP TABLE objects", Hsys::eBadDrawingFile, L"no objects"},
+    };
+    for (const Case& c : cases) {
+        fs::copy_file(good, path, fs::copy_options::overwrite_existing);
+        executeSql(path, c.sql.c_str());
+        HsDbDatabase loaded(HsDb::kEmptyDatabase);
+        std::wstring reason;
+        EXPECT_EQ(load(loaded, &reason), c.expected) << c.sql;
+        EXPECT_NE(reason.find(c.because), std::wstring::npos) << c.sql;
+        EXPECT_TRUE(loaded.objectIds().empty()) << c.sql;
+        EXPECT_TRUE(loaded.modelSpaceId().isNull()) << c.sql;
+    }
+
+    std::ofstream(path, std::ios::trunc) << "plain text, no drawing";
+    HsDbDatabase loaded(HsDb::kEmptyDatabase);
+    EXPECT_EQ(load(loaded), Hsys::eBadDrawingFile);
+    fs::remove(path);
+    EXPECT_EQ(load(loaded), Hsys::eFileNotFound);
+    EXPECT_EQ(original.readDrawingFile(good.wstring().c_str()), Hsys::eDoesNotApply)
+        << "only an empty database is read into";
+    EXPECT_TRUE(loaded.objectIds().empty());
+}
+
+TEST_F(HsDbDrawingFileTest, aFailedSaveLeavesThePreviousFileAsItWas) {
+    HsDbDatabase db;
+    const HsDbObjectId gadget = addGadget(db, L"alt");
+    ASSERT_EQ(save(db), Hsys::eSuccess);
+    const auto before = rowsOf(path);
+
+    HsDbObjectPointer<TestGadget> open(gadget, HsDb::kForWrite);
+    open->setLabel(L"neu");
+    std::wstring reason;
+    EXPECT_EQ(db.saveAs(path.wstring().c_str(), &reason), Hsys::eWasOpenForWrite);
+    EXPECT_NE(reason.find(L"cannot be opened"), std::wstring::npos);
+    open.close();
+    EXPECT_EQ(db.saveAs((directory / "no-such-dir" / "plan.zyr").wstring().c_str()),
+              Hsys::eFileAccessError);
+    EXPECT_EQ(rowsOf(path), before);
+    EXPECT_EQ(std::distance(fs::directory_iterator(directory), fs::directory_iterator()), 1)
+        << "no temporary file is left behind";
+}
+
+TEST_F(HsDbDrawingFileTest, aSaveKilledAtAnyMomentLeavesTheOldOrTheNewDrawing) {
+    HsDbDatabase small;
+    addGadget(small, L"klein");
+    ASSERT_EQ(save(small), Hsys::eSuccess);
+    const std::size_t smallCount = small.objectIds().size();
+
+    HsDbDatabase large;
+    for (int i = 0; i < 3000; ++i)
+        addGadget(large, L"Raum mit einem recht langen Namen, damit die Datei w\u00e4chst");
+    const std::size_t largeCount = large.objectIds().size();
+    // Kills spread over the time a whole save takes here, and one after it.
+    const auto start = std::chrono::steady_clock::now();
+    ASSERT_EQ(large.saveAs((directory / "timing.zyr").wstring().c_str()), Hsys::eSuccess);
+    const auto saveTime = std::chrono::duration_cast<std::chrono::microseconds>(
+        std::chrono::steady_clock::now() - start);
+
+    for (int tenths = 0; tenths <= 12; tenths += 2) {
+        const long delayMicroseconds = saveTime.count() * tenths / 10;
+        const pid_t child = fork();
+        ASSERT_GE(child, 0);
+        if (child == 0) {
+            large.saveAs(path.wstring().c_str());
+            _exit(0);
+        }
+        usleep(static_cast<useconds_t>(delayMicroseconds));
+        kill(child, SIGKILL);
+        int status = 0;
+        waitpid(child, &status, 0);
+
+        HsDbDatabase loaded(HsDb::kEmptyDatabase);
+        std::wstring reason;
+        ASSERT_EQ(load(loaded, &reason), Hsys::eSuccess)
+            << "killed after " << delayMicroseconds << " us: " << reason;
+        const std::size_t count = loaded.objectIds().size();
+        EXPECT_TRUE(count == smallCount || count == largeCount) << count << " objects";
+    }
+}
+
+} // namespace
