@@ -30,12 +30,12 @@ wchar_t foldClassic(wchar_t c) {
 
 int sign(long long value) { return value < 0 ? -1 : value > 0 ? 1 : 0; }
 
-// One positional argument of FormatMessage, formatted by its "!spec!" and taken off the list.
-std::wstring formatPositional(const std::wstring& spec, va_list& args) {
-    const std::wstring format = L"%" + spec;
-    const wchar_t conversion = spec.empty() ? L's' : spec.back();
-    const bool isLong = spec.find(L'l') != std::wstring::npos;
-    const bool isLongLong = spec.find(L"ll") != std::wstring::npos;
+// One positional argument of FormatMessage, formatted by its "!directive!" and taken off the list.
+std::wstring formatPositional(const std::wstring& directive, va_list& args) {
+    const std::wstring format = L"%" + directive;
+    const wchar_t conversion = directive.empty() ? L's' : directive.back();
+    const bool isLong = directive.find(L'l') != std::wstring::npos;
+    const bool isLongLong = directive.find(L"ll") != std::wstring::npos;
     switch (conversion) {
     case L'd':
     case L'i':
@@ -63,7 +63,7 @@ std::wstring formatPositional(const std::wstring& spec, va_list& args) {
     case L'G': return hsutFormat(format.c_str(), va_arg(args, double));
     case L'S': return hsutFormat(format.c_str(), va_arg(args, const char*));
     case L's':
-        if (spec.find(L'h') != std::wstring::npos)
+        if (directive.find(L'h') != std::wstring::npos)
             return hsutFormat(format.c_str(), va_arg(args, const char*));
         return hsutFormat(format.c_str(), va_arg(args, const wchar_t*));
     default: return hsutFormat(format.c_str(), va_arg(args, void*));
@@ -114,17 +114,17 @@ void ZyrRmCString::FormatMessage(const wchar_t* format, ...) {
         int index = 0;
         while (j < pattern.size() && std::iswdigit(pattern[j]) && index < 100)
             index = index * 10 + (pattern[j++] - L'0');
-        std::wstring spec = L"s";
+        std::wstring directive = L"s";
         if (j < pattern.size() && pattern[j] == L'!') {
             const size_t close = pattern.find(L'!', j + 1);
             if (close != std::wstring::npos) {
-                spec = pattern.substr(j + 1, close - j - 1);
+                directive = pattern.substr(j + 1, close - j - 1);
                 j = close + 1;
             }
         }
         if (index == 0)
             continue;
-        specs.emplace(index, spec);
+        specs.emplace(index, directive);
         pieces.push_back({literal, i, 0});
         pieces.push_back({i, j, index});
         literal = j;
@@ -136,8 +136,8 @@ void ZyrRmCString::FormatMessage(const wchar_t* format, ...) {
     std::map<int, std::wstring> values;
     va_list args;
     va_start(args, format);
-    for (const auto& [index, spec] : specs)
-        values[index] = formatPositional(spec, args);
+    for (const auto& [index, directive] : specs)
+        values[index] = formatPositional(directive, args);
     va_end(args);
 
     m_text.clear();

@@ -24,7 +24,7 @@ public:
 
     // printf-style, with the host's wide conventions ("%s" wide, "%S" and "%hs" UTF-8).
     void Format(const wchar_t* format, ...);
-    // Inserts arguments by position: "%1", "%2!d!", ... Without "!spec!" an argument is a wide
+    // Inserts arguments by position: "%1", "%2!d!", ... Without "!format!" an argument is a wide
     // string. "%%" is a percent sign. Arguments are passed in the order of their numbers.
     void FormatMessage(const wchar_t* format, ...);
 

@@ -14,7 +14,7 @@ namespace {
 
 enum class Length { None, Char, Short, Long, LongLong, Size, Max, Ptrdiff, LongDouble };
 
-struct Spec {
+struct Directive {
     bool left = false;
     bool plus = false;
     bool space = false;
@@ -43,53 +43,53 @@ public:
                 continue;
             }
             const wchar_t* start = p++;
-            Spec spec;
-            p = parse(p, spec);
-            if (!convert(spec))
+            Directive directive;
+            p = parse(p, directive);
+            if (!convert(directive))
                 m_out.append(start, p);
         }
         return m_out;
     }
 
 private:
-    const wchar_t* parse(const wchar_t* p, Spec& spec) {
+    const wchar_t* parse(const wchar_t* p, Directive& directive) {
         for (;; ++p) {
             if (*p == L'-')
-                spec.left = true;
+                directive.left = true;
             else if (*p == L'+')
-                spec.plus = true;
+                directive.plus = true;
             else if (*p == L' ')
-                spec.space = true;
+                directive.space = true;
             else if (*p == L'#')
-                spec.alternate = true;
+                directive.alternate = true;
             else if (*p == L'0')
-                spec.zero = true;
+                directive.zero = true;
             else
                 break;
         }
         if (*p == L'*') {
-            spec.width = va_arg(m_args, int);
-            if (spec.width < 0) {
-                spec.left = true;
-                spec.width = -spec.width;
+            directive.width = va_arg(m_args, int);
+            if (directive.width < 0) {
+                directive.left = true;
+                directive.width = -directive.width;
             }
             ++p;
         } else {
-            p = readNumber(p, spec.width);
+            p = readNumber(p, directive.width);
         }
         if (*p == L'.') {
             ++p;
             if (*p == L'*') {
-                spec.precision = va_arg(m_args, int);
+                directive.precision = va_arg(m_args, int);
                 ++p;
             } else {
-                spec.precision = 0;
-                p = readNumber(p, spec.precision);
+                directive.precision = 0;
+                p = readNumber(p, directive.precision);
             }
         }
-        p = parseLength(p, spec);
+        p = parseLength(p, directive);
         if (*p != L'\0')
-            spec.conversion = *p++;
+            directive.conversion = *p++;
         return p;
     }
 
@@ -102,51 +102,51 @@ private:
         return p;
     }
 
-    static const wchar_t* parseLength(const wchar_t* p, Spec& spec) {
+    static const wchar_t* parseLength(const wchar_t* p, Directive& directive) {
         switch (*p) {
         case L'h':
-            spec.length = p[1] == L'h' ? Length::Char : Length::Short;
+            directive.length = p[1] == L'h' ? Length::Char : Length::Short;
             return p + (p[1] == L'h' ? 2 : 1);
         case L'l':
-            spec.length = p[1] == L'l' ? Length::LongLong : Length::Long;
+            directive.length = p[1] == L'l' ? Length::LongLong : Length::Long;
             return p + (p[1] == L'l' ? 2 : 1);
-        case L'z': spec.length = Length::Size; return p + 1;
-        case L'j': spec.length = Length::Max; return p + 1;
-        case L't': spec.length = Length::Ptrdiff; return p + 1;
-        case L'L': spec.length = Length::LongDouble; return p + 1;
+        case L'z': directive.length = Length::Size; return p + 1;
+        case L'j': directive.length = Length::Max; return p + 1;
+        case L't': directive.length = Length::Ptrdiff; return p + 1;
+        case L'L': directive.length = Length::LongDouble; return p + 1;
         default: return p;
         }
     }
 
     // False when the conversion is unknown; the caller then copies the directive through.
-    bool convert(const Spec& spec) {
-        switch (spec.conversion) {
+    bool convert(const Directive& directive) {
+        switch (directive.conversion) {
         case L'%': m_out += L'%'; return true;
         case L'd':
-        case L'i': signedInteger(spec); return true;
+        case L'i': signedInteger(directive); return true;
         case L'u':
         case L'o':
         case L'x':
-        case L'X': unsignedInteger(spec); return true;
+        case L'X': unsignedInteger(directive); return true;
         case L'f':
         case L'F':
         case L'e':
         case L'E':
         case L'g':
-        case L'G': floating(spec); return true;
-        case L's': text(spec, spec.length == Length::Short); return true;
-        case L'S': text(spec, spec.length != Length::Long); return true;
-        case L'c': character(spec, spec.length == Length::Short); return true;
-        case L'C': character(spec, spec.length != Length::Long); return true;
-        case L'p': pointer(spec); return true;
+        case L'G': floating(directive); return true;
+        case L's': text(directive, directive.length == Length::Short); return true;
+        case L'S': text(directive, directive.length != Length::Long); return true;
+        case L'c': character(directive, directive.length == Length::Short); return true;
+        case L'C': character(directive, directive.length != Length::Long); return true;
+        case L'p': pointer(directive); return true;
         case L'n': return true;
         default: return false;
         }
     }
 
-    void signedInteger(const Spec& spec) {
+    void signedInteger(const Directive& directive) {
         long long value = 0;
-        switch (spec.length) {
+        switch (directive.length) {
         case Length::Char: value = static_cast<signed char>(va_arg(m_args, int)); break;
         case Length::Short: value = static_cast<short>(va_arg(m_args, int)); break;
         case Length::Long: value = va_arg(m_args, long); break;
@@ -160,12 +160,12 @@ private:
         const bool negative = value < 0;
         const unsigned long long magnitude =
             negative ? 0ULL - static_cast<unsigned long long>(value) : static_cast<unsigned long long>(value);
-        emitInteger(spec, magnitude, 10, false, signOf(spec, negative), L"");
+        emitInteger(directive, magnitude, 10, false, signOf(directive, negative), L"");
     }
 
-    void unsignedInteger(const Spec& spec) {
+    void unsignedInteger(const Directive& directive) {
         unsigned long long value = 0;
-        switch (spec.length) {
+        switch (directive.length) {
         case Length::Char: value = static_cast<unsigned char>(va_arg(m_args, unsigned)); break;
         case Length::Short: value = static_cast<unsigned short>(va_arg(m_args, unsigned)); break;
         case Length::Long: value = va_arg(m_args, unsigned long); break;
@@ -176,25 +176,25 @@ private:
         case Length::None:
         case Length::LongDouble: value = va_arg(m_args, unsigned); break;
         }
-        const bool hex = spec.conversion == L'x' || spec.conversion == L'X';
-        const int base = hex ? 16 : spec.conversion == L'o' ? 8 : 10;
+        const bool hex = directive.conversion == L'x' || directive.conversion == L'X';
+        const int base = hex ? 16 : directive.conversion == L'o' ? 8 : 10;
         const wchar_t* prefix = L"";
-        if (spec.alternate && value != 0 && hex)
-            prefix = spec.conversion == L'x' ? L"0x" : L"0X";
-        else if (spec.alternate && base == 8)
+        if (directive.alternate && value != 0 && hex)
+            prefix = directive.conversion == L'x' ? L"0x" : L"0X";
+        else if (directive.alternate && base == 8)
             prefix = L"0";
-        emitInteger(spec, value, base, spec.conversion == L'X', L"", prefix);
+        emitInteger(directive, value, base, directive.conversion == L'X', L"", prefix);
     }
 
-    static const wchar_t* signOf(const Spec& spec, bool negative) {
+    static const wchar_t* signOf(const Directive& directive, bool negative) {
         if (negative)
             return L"-";
-        if (spec.plus)
+        if (directive.plus)
             return L"+";
-        return spec.space ? L" " : L"";
+        return directive.space ? L" " : L"";
     }
 
-    void emitInteger(const Spec& spec, unsigned long long value, int base, bool upper,
+    void emitInteger(const Directive& directive, unsigned long long value, int base, bool upper,
                      const wchar_t* sign, const wchar_t* prefix) {
         char buffer[72];
         auto result = std::to_chars(buffer, buffer + sizeof buffer, value, base);
@@ -202,23 +202,23 @@ private:
         if (upper)
             for (auto& c : digits)
                 c = static_cast<wchar_t>(std::towupper(static_cast<wint_t>(c)));
-        if (spec.precision == 0 && value == 0)
+        if (directive.precision == 0 && value == 0)
             digits.clear();
-        if (spec.precision > 0 && digits.size() < static_cast<size_t>(spec.precision))
-            digits.insert(0, static_cast<size_t>(spec.precision) - digits.size(), L'0');
+        if (directive.precision > 0 && digits.size() < static_cast<size_t>(directive.precision))
+            digits.insert(0, static_cast<size_t>(directive.precision) - digits.size(), L'0');
         if (*prefix == L'0' && prefix[1] == L'\0' && !digits.empty() && digits[0] == L'0')
             prefix = L"";
         // A precision on an integer overrides the zero flag, as in C.
-        emitNumber(spec, std::wstring(sign) + prefix, digits, spec.precision < 0);
+        emitNumber(directive, std::wstring(sign) + prefix, digits, directive.precision < 0);
     }
 
-    void floating(const Spec& spec) {
+    void floating(const Directive& directive) {
         const long double wide =
-            spec.length == Length::LongDouble ? va_arg(m_args, long double) : va_arg(m_args, double);
+            directive.length == Length::LongDouble ? va_arg(m_args, long double) : va_arg(m_args, double);
         const double value = static_cast<double>(wide);
-        const int precision = spec.precision < 0 ? 6 : spec.precision;
+        const int precision = directive.precision < 0 ? 6 : directive.precision;
         std::chars_format format = std::chars_format::general;
-        switch (spec.conversion) {
+        switch (directive.conversion) {
         case L'f':
         case L'F': format = std::chars_format::fixed; break;
         case L'e':
@@ -230,21 +230,21 @@ private:
         auto result = std::to_chars(buffer, buffer + sizeof buffer, magnitude, format,
                                     format == std::chars_format::general && precision == 0 ? 1 : precision);
         std::wstring digits = result.ec == std::errc() ? std::wstring(buffer, result.ptr) : L"?";
-        if (std::iswupper(static_cast<wint_t>(spec.conversion)))
+        if (std::iswupper(static_cast<wint_t>(directive.conversion)))
             for (auto& c : digits)
                 c = static_cast<wchar_t>(std::towupper(static_cast<wint_t>(c)));
         const bool finite = std::isfinite(value);
-        emitNumber(spec, signOf(spec, std::signbit(value) && !std::isnan(value)), digits, finite);
+        emitNumber(directive, signOf(directive, std::signbit(value) && !std::isnan(value)), digits, finite);
     }
 
-    void emitNumber(const Spec& spec, const std::wstring& head, const std::wstring& digits,
+    void emitNumber(const Directive& directive, const std::wstring& head, const std::wstring& digits,
                     bool zeroPadAllowed) {
         const size_t length = head.size() + digits.size();
-        const size_t pad = static_cast<size_t>(spec.width) > length ? spec.width - length : 0;
-        if (spec.left) {
+        const size_t pad = static_cast<size_t>(directive.width) > length ? directive.width - length : 0;
+        if (directive.left) {
             m_out += head + digits;
             m_out.append(pad, L' ');
-        } else if (spec.zero && zeroPadAllowed) {
+        } else if (directive.zero && zeroPadAllowed) {
             m_out += head;
             m_out.append(pad, L'0');
             m_out += digits;
@@ -254,7 +254,7 @@ private:
         }
     }
 
-    void text(const Spec& spec, bool narrow) {
+    void text(const Directive& directive, bool narrow) {
         std::wstring value;
         if (narrow) {
             const char* s = va_arg(m_args, const char*);
@@ -263,31 +263,31 @@ private:
             const wchar_t* s = va_arg(m_args, const wchar_t*);
             value = s == nullptr ? L"(null)" : s;
         }
-        if (spec.precision >= 0 && value.size() > static_cast<size_t>(spec.precision))
-            value.resize(static_cast<size_t>(spec.precision));
-        pad(spec, value);
+        if (directive.precision >= 0 && value.size() > static_cast<size_t>(directive.precision))
+            value.resize(static_cast<size_t>(directive.precision));
+        pad(directive, value);
     }
 
-    void character(const Spec& spec, bool narrow) {
+    void character(const Directive& directive, bool narrow) {
         // Both kinds arrive promoted: a narrow char as int, a wchar_t as wint_t.
         wchar_t c = narrow ? static_cast<wchar_t>(static_cast<unsigned char>(va_arg(m_args, int)))
                            : static_cast<wchar_t>(va_arg(m_args, wint_t));
-        pad(spec, std::wstring(1, c));
+        pad(directive, std::wstring(1, c));
     }
 
-    void pointer(const Spec& spec) {
+    void pointer(const Directive& directive) {
         const auto value = reinterpret_cast<uintptr_t>(va_arg(m_args, void*));
-        Spec hex = spec;
+        Directive hex = directive;
         hex.conversion = L'x';
         emitInteger(hex, value, 16, false, L"", L"0x");
     }
 
-    void pad(const Spec& spec, const std::wstring& value) {
-        const size_t padding = static_cast<size_t>(spec.width) > value.size() ? spec.width - value.size() : 0;
-        if (!spec.left)
+    void pad(const Directive& directive, const std::wstring& value) {
+        const size_t padding = static_cast<size_t>(directive.width) > value.size() ? directive.width - value.size() : 0;
+        if (!directive.left)
             m_out.append(padding, L' ');
         m_out += value;
-        if (spec.left)
+        if (directive.left)
             m_out.append(padding, L' ');
     }
 
