@@ -1,5 +1,7 @@
 #include "platform/base/app/ZyrBaseServices.h"
 
+#include "platform/base/relgraph/ZyrObjRelGraph.h"
+#include "platform/host/db/HsDbDatabase.h"
 #include "platform/host/rx/HsRxClass.h"
 #include "platform/host/rx/HsRxDynamicLinker.h"
 #include "platform/host/rx/HsRxSysRegistry.h"
@@ -17,7 +19,35 @@ HsRxDynamicLinker* linker() {
 
 } // namespace
 
+ZyrBaseServices::ZyrBaseServices() = default;
+
+ZyrBaseServices::~ZyrBaseServices() {
+    for (const auto& [database, graph] : m_graphs)
+        database->removeReactor(this);
+}
+
 ZyrBaseServices* ZyrBaseServices::service() { return gService; }
+
+ZyrObjRelGraph* ZyrBaseServices::objRelGraph(HsDbDatabase* database) {
+    if (database == nullptr)
+        return nullptr;
+    std::unique_ptr<ZyrObjRelGraph>& graph = m_graphs[database];
+    if (graph == nullptr) {
+        database->addReactor(this);
+        graph = std::make_unique<ZyrObjRelGraph>(database);
+    }
+    return graph.get();
+}
+
+ZyrObjRelGraph* ZyrBaseServices::findObjRelGraph(const HsDbDatabase* database) const {
+    const auto found = m_graphs.find(database);
+    return found != m_graphs.end() ? found->second.get() : nullptr;
+}
+
+void ZyrBaseServices::goodbye(HsDbDatabase* database) {
+    database->removeReactor(this);
+    m_graphs.erase(database);
+}
 
 Hsys::ErrorStatus ZyrBaseServices::registerService(ZyrAppHdx* app) {
     if (app == nullptr)

@@ -2,10 +2,15 @@
 // (relationship graph, display and migration managers) that later layers add to it.
 #pragma once
 
+#include "platform/host/db/HsDbDatabaseReactor.h"
 #include "platform/host/rx/HsRxService.h"
+
+#include <map>
+#include <memory>
 
 class HsDbDatabase;
 class ZyrAppHdx;
+class ZyrObjRelGraph;
 
 // What an editor (a user interface around the drawings) offers the objects. A batch run has none.
 class ZyrEditorServices {
@@ -15,10 +20,14 @@ public:
     virtual bool isRegenerating(HsDbDatabase* database) const = 0;
 };
 
-class ZyrBaseServices : public HsRxService {
+class ZyrBaseServices : public HsRxService, private HsDbDatabaseReactor {
     HSRX_DECLARE_MEMBERS(ZyrBaseServices)
 
 public:
+    ZyrBaseServices();
+    // Takes its relationship graphs with it.
+    ~ZyrBaseServices() override;
+
     static constexpr const wchar_t* kServiceName = L"ZyrBaseServices";
 
     // The service while any module is registered with it, else null.
@@ -34,6 +43,15 @@ public:
     // Installed by a host that has an editor; not owned.
     void setEditorServices(ZyrEditorServices* editor) { m_editor = editor; }
 
+    // The relationship graph of a database, made on the first request and gone with the database
+    // or with the service. Null for a null database.
+    ZyrObjRelGraph* objRelGraph(HsDbDatabase* database);
+    // The graph made for a database, or null when none was asked for yet.
+    ZyrObjRelGraph* findObjRelGraph(const HsDbDatabase* database) const;
+
 private:
+    void goodbye(HsDbDatabase* database) override;
+
     ZyrEditorServices* m_editor = nullptr;
+    std::map<HsDbDatabase*, std::unique_ptr<ZyrObjRelGraph>, std::less<>> m_graphs;
 };

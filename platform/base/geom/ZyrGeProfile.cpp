@@ -3,6 +3,8 @@
 #include "platform/base/geom/ZyrGeProfile.h"
 
 #include "platform/base/geom/ZyrGeBoundBox3d.h"
+#include "platform/base/obj/ZyrConvertLegacyExtendData.h"
+#include "platform/base/obj/ZyrRegisterRelgraph.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
 #include "platform/host/ge/HsGeMatrix3d.h"
 #include "platform/host/rx/HsRxClass.h"
@@ -13,12 +15,11 @@
 #include <cstdint>
 #include <utility>
 
-HSRX_DEFINE_MEMBERS(ZyrGeProfile, HsRxObject, 0, hsrxInstantiateClass<ZyrGeProfile>)
+HSRX_DEFINE_MEMBERS(ZyrGeProfile, ZyrImpObj, 0, hsrxInstantiateClass<ZyrGeProfile>)
 
 namespace {
 
 constexpr int kExtentRounds = 20;
-constexpr std::int16_t kProfileVersion = 80;
 // A segment is filed as two points and a bulge, a ring as its segment count and its segments.
 constexpr std::size_t kFiledSegmentSize = 5 * sizeof(double);
 constexpr std::size_t kMinFiledRingSize = sizeof(std::uint32_t);
@@ -88,7 +89,7 @@ bool meetsWrongly(const PlacedSegment& a, const PlacedSegment& b, bool neighbour
 ZyrGeProfile::ZyrGeProfile() = default;
 
 ZyrGeProfile::ZyrGeProfile(const ZyrGeProfile& other)
-    : HsRxObject(other), m_left(other.m_left), m_top(other.m_top), m_right(other.m_right),
+    : ZyrImpObj(), m_left(other.m_left), m_top(other.m_top), m_right(other.m_right),
       m_bottom(other.m_bottom), m_extentsStale(other.m_extentsStale) {
     m_rings.reserve(other.m_rings.size());
     for (const auto& ring : other.m_rings) {
@@ -99,6 +100,7 @@ ZyrGeProfile::ZyrGeProfile(const ZyrGeProfile& other)
 ZyrGeProfile& ZyrGeProfile::operator=(const ZyrGeProfile& other) {
     if (this != &other) {
         ZyrGeProfile copy(other);
+        assertParentWriteEnabled();
         m_rings = std::move(copy.m_rings);
         m_left = copy.m_left;
         m_top = copy.m_top;
@@ -112,9 +114,12 @@ ZyrGeProfile& ZyrGeProfile::operator=(const ZyrGeProfile& other) {
 ZyrGeProfile::~ZyrGeProfile() = default;
 
 Hsys::ErrorStatus ZyrGeProfile::copyFrom(const HsRxObject* other) {
+    if (const Hsys::ErrorStatus status = ZyrImpObj::copyFrom(other); status != Hsys::eSuccess) {
+        return status;
+    }
     const ZyrGeProfile* source = ZyrGeProfile::cast(other);
     if (source == nullptr) {
-        return Hsys::eWrongClass;
+        return Hsys::eBadArgument;
     }
     *this = *source;
     return Hsys::eSuccess;
@@ -124,7 +129,9 @@ Hsys::ErrorStatus ZyrGeProfile::addRing(ZyrGeRing* ring) {
     if (ring == nullptr) {
         return Hsys::eNullPointer;
     }
-    m_rings.emplace_back(ring);
+    std::unique_ptr<ZyrGeRing> owned(ring);
+    assertParentWriteEnabled();
+    m_rings.push_back(std::move(owned));
     m_extentsStale = true;
     return Hsys::eSuccess;
 }
@@ -139,6 +146,7 @@ ZyrGeRing* ZyrGeProfile::ring(int index) {
 }
 
 void ZyrGeProfile::removeAllRings() {
+    assertParentWriteEnabled();
     m_rings.clear();
     m_extentsStale = true;
 }
@@ -237,6 +245,7 @@ Hsys::ErrorStatus ZyrGeProfile::setExtent(double width, double height) {
 }
 
 void ZyrGeProfile::transformBy(const HsGeMatrix3d& matrix) {
+    assertParentWriteEnabled();
     const bool mirrors = matrix(0, 0) * matrix(1, 1) - matrix(0, 1) * matrix(1, 0) < 0.0;
     for (auto& ring : m_rings) {
         ring->transformBy(matrix);
@@ -266,7 +275,10 @@ Hsys::ErrorStatus ZyrGeProfile::bdfOutFields(HsDbBdfFiler* filer) const {
     if (filer == nullptr) {
         return Hsys::eNullPointer;
     }
-    filer->writeInt16(kProfileVersion);
+    if (const Hsys::ErrorStatus status = ZyrImpObj::bdfOutFields(filer); status != Hsys::eSuccess) {
+        return status;
+    }
+    bdfOutVersion(filer);
     filer->writeUInt32(static_cast<std::uint32_t>(m_rings.size()));
     for (const auto& ring : m_rings) {
         filer->writeUInt32(static_cast<std::uint32_t>(ring->segmentCount()));
@@ -284,13 +296,13 @@ Hsys::ErrorStatus ZyrGeProfile::bdfInFields(HsDbBdfFiler* filer) {
     if (filer == nullptr) {
         return Hsys::eNullPointer;
     }
-    std::int16_t version = 0;
-    if (filer->readInt16(version) != Hsys::eSuccess) {
-        return filer->filerStatus();
+    ZyrRegisterRelgraph relgraph(filer, this, ZyrGeProfile::desc());
+    ZyrConvertLegacyExtendData legacy(filer, this, ZyrGeProfile::desc());
+    if (const Hsys::ErrorStatus status = ZyrImpObj::bdfInFields(filer); status != Hsys::eSuccess) {
+        return status;
     }
-    if (version > kProfileVersion) {
-        filer->setFilerStatus(Hsys::eNewerVersion);
-        return filer->filerStatus();
+    if (const Hsys::ErrorStatus status = bdfInVersion(filer); status != Hsys::eSuccess) {
+        return status;
     }
     std::uint32_t ringTotal = 0;
     if (readCount(filer, kMinFiledRingSize, ringTotal) != Hsys::eSuccess) {

@@ -3,8 +3,8 @@
 #pragma once
 
 #include "platform/base/geom/ZyrGeRing.h"
+#include "platform/base/obj/ZyrImpObj.h"
 #include "platform/host/ge/HsGeContext.h"
-#include "platform/host/rx/HsRxObject.h"
 
 #include <memory>
 #include <vector>
@@ -12,24 +12,30 @@
 class HsDbBdfFiler;
 class HsGeMatrix3d;
 
-class ZyrGeProfile : public HsRxObject {
+// A profile is an implementation object, nested in the object that holds it (an area), which
+// makes itself the profile's parent: every change asserts write on the public object at the top,
+// so that a transaction can put the profile back. A profile without a parent is always writable.
+// A profile holds no references to other objects and takes nothing from the database.
+class ZyrGeProfile : public ZyrImpObj {
     HSRX_DECLARE_MEMBERS(ZyrGeProfile)
 
 public:
     ZyrGeProfile();
-    // Copies every ring.
+    // Copies every ring; the copy has no parent.
     ZyrGeProfile(const ZyrGeProfile& other);
+    // Copies every ring and keeps the parent.
     ZyrGeProfile& operator=(const ZyrGeProfile& other);
     ~ZyrGeProfile() override;
 
-    // The rings and extents of another profile; eWrongClass for an object that is no profile.
+    // The rings and extents of another profile; eBadArgument for an object that is no profile.
     Hsys::ErrorStatus copyFrom(const HsRxObject* other) override;
 
     // Takes the ring over and appends it; a null ring is refused.
     [[nodiscard]] Hsys::ErrorStatus addRing(ZyrGeRing* ring);
     int ringCount() const { return static_cast<int>(m_rings.size()); }
     // Null outside [0, ringCount()). The writable form marks the extents stale, since the ring
-    // may be changed through it.
+    // may be changed through it; it asserts nothing, so whoever changes a ring through it asserts
+    // write on the profile's parent first.
     const ZyrGeRing* ring(int index) const;
     ZyrGeRing* ring(int index);
     void removeAllRings();
@@ -55,12 +61,13 @@ public:
     // and holes negative.
     void transformBy(const HsGeMatrix3d& matrix);
 
-    // The profile's own fields: a version word, the rings, and each segment's start, end and
-    // bulge; the extents are not filed. A reader checks every count against the bytes that are
-    // left and changes the profile only when all was read; a version above its own is refused with
-    // eNewerVersion.
-    [[nodiscard]] Hsys::ErrorStatus bdfOutFields(HsDbBdfFiler* filer) const;
-    [[nodiscard]] Hsys::ErrorStatus bdfInFields(HsDbBdfFiler* filer);
+    // After ZyrImpObj's fields: the profile's version word, the rings, and each segment's start,
+    // end and bulge; the extents are not filed. A reader checks every count against the bytes that
+    // are left and changes the profile only when all was read; a version above the current one is
+    // refused with eNewerVersion (Zyr::bdfReadVersion). Nested in another object's stream, a
+    // profile goes through Zyr::writeObject and Zyr::readObject.
+    [[nodiscard]] Hsys::ErrorStatus bdfOutFields(HsDbBdfFiler* filer) const override;
+    [[nodiscard]] Hsys::ErrorStatus bdfInFields(HsDbBdfFiler* filer) override;
 
     // The extents rectangle as last refreshed, arcs included; all 0 for a profile without rings.
     double left() const { return m_left; }

@@ -98,7 +98,7 @@ void ZyrRmCString::FormatMessage(const wchar_t* format, ...) {
     const std::wstring pattern = format != nullptr ? format : L"";
     // Literal runs are inserts with index 0.
     std::vector<Insert> pieces;
-    std::map<int, std::wstring> specs;
+    std::map<int, std::wstring> directives;
     size_t literal = 0;
     for (size_t i = 0; i < pattern.size(); ++i) {
         if (pattern[i] != L'%' || i + 1 >= pattern.size())
@@ -124,7 +124,7 @@ void ZyrRmCString::FormatMessage(const wchar_t* format, ...) {
         }
         if (index == 0)
             continue;
-        specs.emplace(index, directive);
+        directives.emplace(index, directive);
         pieces.push_back({literal, i, 0});
         pieces.push_back({i, j, index});
         literal = j;
@@ -136,7 +136,7 @@ void ZyrRmCString::FormatMessage(const wchar_t* format, ...) {
     std::map<int, std::wstring> values;
     va_list args;
     va_start(args, format);
-    for (const auto& [index, directive] : specs)
+    for (const auto& [index, directive] : directives)
         values[index] = formatPositional(directive, args);
     va_end(args);
 

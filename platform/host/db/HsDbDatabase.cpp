@@ -2,6 +2,7 @@
 
 #include "platform/host/db/HsDbAuditInfo.h"
 #include "platform/host/db/HsDbBlockTable.h"
+#include "platform/host/db/HsDbDatabaseReactor.h"
 #include "platform/host/db/HsDbDictionary.h"
 #include "platform/host/db/HsDbHostApplicationServices.h"
 #include "platform/host/db/HsDbIdEntry.h"
@@ -13,6 +14,7 @@
 #include "platform/host/rx/HsRxClass.h"
 #include "platform/host/ut/HsutFormat.h"
 
+#include <algorithm>
 #include <utility>
 
 HSRX_DEFINE_MEMBERS(HsDbDatabase, HsRxObject, 0, nullptr)
@@ -40,6 +42,16 @@ HsDbObjectId addRecord(HsDbObjectId tableId, HsDbSymbolTableRecord* record, cons
     return id;
 }
 
+// A reactor may remove itself or another one while it is told; the list is walked on a copy and
+// each reactor is asked whether it is still registered when its turn comes.
+template <class Report>
+void tellRegistered(const std::vector<HsDbDatabaseReactor*>& reactors, Report report) {
+    const std::vector<HsDbDatabaseReactor*> snapshot = reactors;
+    for (HsDbDatabaseReactor* reactor : snapshot)
+        if (std::find(reactors.begin(), reactors.end(), reactor) != reactors.end())
+            report(reactor);
+}
+
 } // namespace
 
 HsDbDatabase::HsDbDatabase(HsDb::DrawingSetup setup, HsDb::TransactionSupport transactions) {
@@ -50,6 +62,8 @@ HsDbDatabase::HsDbDatabase(HsDb::DrawingSetup setup, HsDb::TransactionSupport tr
 }
 
 HsDbDatabase::~HsDbDatabase() {
+    notifyReactors(&HsDbDatabaseReactor::goodbye);
+    m_reactors.clear();
     if (hsdbHostApplicationServices()->workingDatabase() == this)
         hsdbHostApplicationServices()->setWorkingDatabase(nullptr);
     clear();
@@ -97,6 +111,7 @@ Hsys::ErrorStatus HsDbDatabase::addHsDbObject(HsDbObjectId& id, HsDbObject* obje
         m_transactions->recordAdded(entry);
     object->subSetDatabaseDefaults(this);
     id = HsDbObjectId(entry);
+    notifyAppended(object);
     return Hsys::eSuccess;
 }
 
@@ -224,7 +239,29 @@ Hsys::ErrorStatus HsDbDatabase::audit(HsDbAuditInfo* info) {
     return Hsys::eSuccess;
 }
 
+void HsDbDatabase::addReactor(HsDbDatabaseReactor* reactor) {
+    if (reactor != nullptr &&
+        std::find(m_reactors.begin(), m_reactors.end(), reactor) == m_reactors.end())
+        m_reactors.push_back(reactor);
+}
+
+void HsDbDatabase::removeReactor(HsDbDatabaseReactor* reactor) {
+    std::erase(m_reactors, reactor);
+}
+
+void HsDbDatabase::notifyReactors(void (HsDbDatabaseReactor::*report)(HsDbDatabase*)) {
+    tellRegistered(m_reactors,
+                   [this, report](HsDbDatabaseReactor* reactor) { (reactor->*report)(this); });
+}
+
+void HsDbDatabase::notifyAppended(HsDbObject* object) {
+    tellRegistered(m_reactors, [this, object](HsDbDatabaseReactor* reactor) {
+        reactor->objectAppended(this, object);
+    });
+}
+
 void HsDbDatabase::clear() {
+    const bool heldObjects = !m_entries.empty();
     for (auto& [handle, entry] : m_entries)
         if (entry->object != nullptr)
             delete disown(entry.get());
@@ -234,4 +271,6 @@ void HsDbDatabase::clear() {
     m_nextHandle = 1;
     m_roots = Roots{};
     m_xrefBlockId.setNull();
+    if (heldObjects)
+        notifyReactors(&HsDbDatabaseReactor::databaseCleared);
 }

@@ -12,6 +12,7 @@
 #include <vector>
 
 class HsDbAuditInfo;
+class HsDbDatabaseReactor;
 class HsDbObject;
 class HsDbTransactionManager;
 struct HsDbIdEntry;
@@ -90,6 +91,11 @@ public:
     // otherwise. Objects that cannot be opened are skipped and counted as errors.
     Hsys::ErrorStatus audit(HsDbAuditInfo* info);
 
+    // Reactors hear of objects that enter the database, of its emptying and of its end. Not owned;
+    // adding one twice keeps one, removing one that is not registered does nothing.
+    void addReactor(HsDbDatabaseReactor* reactor);
+    void removeReactor(HsDbDatabaseReactor* reactor);
+
 private:
     friend class HsDbDrawingFile;
     friend class HsDbObject;
@@ -119,6 +125,9 @@ private:
     // Deletes every object and entry and forgets the roots: the database is empty again.
     void clear();
     double displayFactor() const;
+    // Tells every reactor that is registered when its turn comes.
+    void notifyReactors(void (HsDbDatabaseReactor::*report)(HsDbDatabase*));
+    void notifyAppended(HsDbObject* object);
 
     std::map<std::uint64_t, std::unique_ptr<HsDbIdEntry>> m_entries;
     std::uint64_t m_nextHandle = 1;
@@ -127,4 +136,5 @@ private:
     HsDbObjectId m_xrefBlockId;
     std::wstring m_fileName;
     std::unique_ptr<HsDbTransactionManager> m_transactions;
+    std::vector<HsDbDatabaseReactor*> m_reactors;
 };

@@ -224,9 +224,11 @@ Hsys::ErrorStatus HsDbObject::handOverTo(HsDbObject* newObject) {
     newObject->m_writer = true;
     newObject->m_modified = true;
     m_entry->object = newObject;
+    HsDbDatabase* database = m_entry->database;
     m_entry = nullptr;
     m_writer = false;
     m_modified = false;
+    database->notifyAppended(newObject);
     return Hsys::eSuccess;
 }
 

@@ -410,6 +410,7 @@ struct HsDbDrawingFile::Access {
         database->adopt(entry, object);
         HsDbObject* opened = nullptr;
         hsdbOpenObject(opened, HsDbObjectId(entry), HsDb::kForWrite, true);
+        database->notifyAppended(object);
         return object;
     }
 

@@ -1,9 +1,15 @@
-// Profiles: the sample area, extents, scaling, transformation, copying and validity.
+// Profiles: the sample area, extents, scaling, transformation, copying, validity and filing, alone
+// and nested in the object that holds them.
 #include "platform/base/geom/ZyrGeProfile.h"
+#include "platform/base/obj/ZyrDbGeo.h"
+#include "platform/base/obj/ZyrFiling.h"
+#include "platform/base/obj/ZyrImpGeo.h"
+#include "platform/host/db/HsDbDatabase.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
 #include "platform/host/ge/HsGeCircArc2d.h"
 #include "platform/host/ge/HsGeLineSeg2d.h"
 #include "platform/host/ge/HsGeMatrix3d.h"
+#include "platform/host/ut/HsAssertionViolation.h"
 
 #include <gtest/gtest.h>
 
@@ -180,7 +186,9 @@ TEST(ZyrGeProfile, copyFromIsDeepAndRefusesOtherClasses) {
     source.removeAllRings();
     EXPECT_NEAR(copy.area(0.0), kSampleArea, 1e-9);
     HsRxObject plain;
-    EXPECT_EQ(copy.copyFrom(&plain), Hsys::eWrongClass);
+    EXPECT_EQ(copy.copyFrom(&plain), Hsys::eBadArgument);
+    ZyrImpGeo otherImplementation;
+    EXPECT_EQ(copy.copyFrom(&otherImplementation), Hsys::eBadArgument);
     EXPECT_EQ(copy.ringCount(), 2);
     std::unique_ptr<HsRxObject> clone(copy.clone());
     ASSERT_NE(ZyrGeProfile::cast(clone.get()), nullptr);
@@ -281,7 +289,8 @@ TEST(ZyrGeProfile, filedBytesAreVersionCountsPointsAndBulges) {
     auto* ring = new ZyrGeRing;
     ASSERT_EQ(ring->addSegment(new ZyrGeSegment2d({1, 2}, {1, 2}, -1.0)), Hsys::eSuccess);
     ASSERT_EQ(profile.addRing(ring), Hsys::eSuccess);
-    std::vector<std::uint8_t> expected = {0x50, 0x00, 1, 0, 0, 0, 1, 0, 0, 0};
+    // The implementation base's version word, the profile's, one ring of one segment.
+    std::vector<std::uint8_t> expected = {0x50, 0x00, 0x50, 0x00, 1, 0, 0, 0, 1, 0, 0, 0};
     for (const double value : {1.0, 2.0, 1.0, 2.0, -1.0}) {
         const auto* bytes = reinterpret_cast<const std::uint8_t*>(&value);
         expected.insert(expected.end(), bytes, bytes + sizeof value);
@@ -307,19 +316,67 @@ TEST(ZyrGeProfile, readerRefusesNewerVersionsAndCountsBeyondTheBytes) {
         Hsys::ErrorStatus status;
     };
     const Case cases[] = {
-        {"version 81", {0x51, 0x00, 0, 0, 0, 0}, Hsys::eNewerVersion},
-        {"four billion rings", {0x50, 0x00, 0xff, 0xff, 0xff, 0xff}, Hsys::eFilerError},
+        {"base version 81", {0x51, 0x00, 0x50, 0x00, 0, 0, 0, 0}, Hsys::eNewerVersion},
+        {"profile version 81", {0x50, 0x00, 0x51, 0x00, 0, 0, 0, 0}, Hsys::eNewerVersion},
+        {"four billion rings", {0x50, 0x00, 0x50, 0x00, 0xff, 0xff, 0xff, 0xff}, Hsys::eFilerError},
         {"ring of more segments than bytes",
-         {0x50, 0x00, 1, 0, 0, 0, 1, 0, 0, 0, 0, 0, 0},
+         {0x50, 0x00, 0x50, 0x00, 1, 0, 0, 0, 1, 0, 0, 0, 0, 0, 0},
          Hsys::eFilerError},
-        {"no rings", {0x50, 0x00, 0, 0, 0, 0}, Hsys::eSuccess},
+        {"no rings", {0x50, 0x00, 0x50, 0x00, 0, 0, 0, 0}, Hsys::eSuccess},
+        {"version 25 drops a bool", {0x19, 0x00, 1, 0x19, 0x00, 0, 0, 0, 0, 0}, Hsys::eSuccess},
+        {"version 25 without its bool", {0x50, 0x00, 0x19, 0x00, 0, 0, 0, 0}, Hsys::eFilerError},
     };
     for (const Case& c : cases) {
         ZyrGeProfile profile = sampleProfile();
         HsDbBdfFiler reader(c.bytes, nullptr);
         EXPECT_EQ(profile.bdfInFields(&reader), c.status) << c.name;
         EXPECT_EQ(profile.ringCount(), c.status == Hsys::eSuccess ? 0 : 2) << c.name;
+        if (c.status == Hsys::eNewerVersion) {
+            EXPECT_EQ(reader.filerStatus(), Hsys::eSuccess) << c.name;
+            EXPECT_EQ(profile.filedVersion(), 81) << c.name;
+        }
     }
+}
+
+TEST(ZyrGeProfile, nestedProfileRoundTripsWithItsClassAndTakesItsOwnerAsParent) {
+    const ZyrGeProfile source = sampleProfile();
+    HsDbBdfFiler writer;
+    ASSERT_EQ(Zyr::writeObject(&writer, &source, 80), Hsys::eSuccess);
+    ZyrImpGeo owner;
+    ZyrImpObj* read = nullptr;
+    HsDbBdfFiler reader(writer.bytes(), nullptr);
+    ASSERT_EQ(Zyr::readObject(&reader, &owner, read, 80), Hsys::eSuccess);
+    std::unique_ptr<ZyrImpObj> held(read);
+    const ZyrGeProfile* profile = ZyrGeProfile::cast(read);
+    ASSERT_NE(profile, nullptr);
+    EXPECT_EQ(profile->impParent(), &owner);
+    EXPECT_EQ(profile->area(0.0), source.area(0.0));
+    EXPECT_EQ(reader.remaining(), 0u);
+}
+
+TEST(ZyrGeProfile, changesAskWriteAccessOfThePublicObjectAtTheTop) {
+    HsDbDatabase database;
+    auto* entity = new ZyrDbGeo;
+    HsDbObjectId id;
+    ASSERT_EQ(database.addHsDbObject(id, entity), Hsys::eSuccess);
+    ZyrImpGeo holder;
+    holder.setParent(static_cast<HsDbObject*>(entity));
+    ZyrGeProfile profile = sampleProfile();
+    profile.setParent(&holder);
+    EXPECT_EQ(profile.dbParent(), entity);
+    EXPECT_EQ(profile.database(), &database);
+    ASSERT_EQ(entity->downgradeOpen(), Hsys::eSuccess);
+
+    EXPECT_THROW(profile.transformBy(HsGeMatrix3d::translation({1, 0, 0})), HsAssertionViolation);
+    EXPECT_THROW(static_cast<void>(profile.addRing(new ZyrGeRing)), HsAssertionViolation);
+    EXPECT_THROW(profile.removeAllRings(), HsAssertionViolation);
+    EXPECT_EQ(profile.ringCount(), 2);
+    EXPECT_NEAR(profile.area(0.0), kSampleArea, 1e-9);
+
+    ASSERT_EQ(entity->upgradeOpen(), Hsys::eSuccess);
+    EXPECT_EQ(profile.scale(2.0, 2.0), Hsys::eSuccess);
+    EXPECT_NEAR(profile.area(0.0), 4.0 * kSampleArea, 1e-9);
+    entity->close();
 }
 
 } // namespace

@@ -1,0 +1,5 @@
+#include "platform/base/obj/ZyrConvertLegacyExtendData.h"
+
+ZyrConvertLegacyExtendData::ZyrConvertLegacyExtendData(HsDbBdfFiler* /*filer*/,
+                                                       const HsRxObject* /*object*/,
+                                                       const HsRxClass* /*cls*/) {}

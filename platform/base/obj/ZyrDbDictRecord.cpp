@@ -1,0 +1,70 @@
+#include "platform/base/obj/ZyrDbDictRecord.h"
+
+#include "platform/base/obj/ZyrConvertLegacyExtendData.h"
+#include "platform/base/obj/ZyrImpDictRecord.h"
+#include "platform/base/obj/ZyrRegisterRelgraph.h"
+#include "platform/host/filer/HsDbBdfFiler.h"
+#include "platform/host/rx/HsRxClass.h"
+
+HSRX_DEFINE_MEMBERS(ZyrDbDictRecord, ZyrDbObject, 0, hsrxInstantiateClass<ZyrDbDictRecord>)
+
+ZyrDbDictRecord::ZyrDbDictRecord(bool createImp) : ZyrDbObject(false) {
+    if (createImp)
+        replaceImp(new ZyrImpDictRecord);
+}
+
+ZyrDbDictRecord::~ZyrDbDictRecord() = default;
+
+Hsys::ErrorStatus ZyrDbDictRecord::bdfInFields(HsDbBdfFiler* filer) {
+    ZyrRegisterRelgraph relgraph(filer, this, ZyrDbDictRecord::desc());
+    ZyrConvertLegacyExtendData legacy(filer, this, ZyrDbDictRecord::desc());
+    if (const Hsys::ErrorStatus status = ZyrDbObject::bdfInFields(filer); status != Hsys::eSuccess)
+        return status;
+    if (const Hsys::ErrorStatus status = bdfInVersion(filer); status != Hsys::eSuccess)
+        return status;
+    return filer->filerStatus();
+}
+
+Hsys::ErrorStatus ZyrDbDictRecord::bdfOutFields(HsDbBdfFiler* filer) const {
+    if (const Hsys::ErrorStatus status = ZyrDbObject::bdfOutFields(filer); status != Hsys::eSuccess)
+        return status;
+    return bdfOutVersion(filer);
+}
+
+ZyrImpDictRecord* ZyrDbDictRecord::recordImp() {
+    return ZyrImpDictRecord::cast(imp());
+}
+
+const ZyrImpDictRecord* ZyrDbDictRecord::recordImp() const {
+    return ZyrImpDictRecord::cast(imp());
+}
+
+Hsys::ErrorStatus ZyrDbDictRecord::getName(ZyrRmCString& name) const {
+    assertReadEnabled();
+    if (recordImp() == nullptr)
+        return Hsys::eNullPointer;
+    name = recordImp()->name();
+    return Hsys::eSuccess;
+}
+
+Hsys::ErrorStatus ZyrDbDictRecord::setName(const ZyrRmCString& name) {
+    assertWriteEnabled();
+    if (recordImp() == nullptr)
+        return Hsys::eNullPointer;
+    return recordImp()->setName(name);
+}
+
+Hsys::ErrorStatus ZyrDbDictRecord::getDescription(ZyrRmCString& description) const {
+    assertReadEnabled();
+    if (recordImp() == nullptr)
+        return Hsys::eNullPointer;
+    description = recordImp()->description();
+    return Hsys::eSuccess;
+}
+
+Hsys::ErrorStatus ZyrDbDictRecord::setDescription(const ZyrRmCString& description) {
+    assertWriteEnabled();
+    if (recordImp() == nullptr)
+        return Hsys::eNullPointer;
+    return recordImp()->setDescription(description);
+}

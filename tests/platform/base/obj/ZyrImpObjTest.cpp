@@ -1,0 +1,291 @@
+// Implementation objects: parents through nesting, reported parameter changes travelling up to
+// the public object, reference checks, database defaults, and the owning array.
+#include "tests/platform/base/obj/ZyrSampleObjects.h"
+
+#include "platform/base/obj/ZyrEnhancedReferenceAuditInfo.h"
+#include "platform/base/obj/ZyrImpArray.h"
+#include "platform/base/obj/ZyrParamContainer.h"
+#include "platform/host/db/HsDbDatabase.h"
+#include "platform/host/db/HsDbObjectPointer.h"
+#include "platform/host/filer/HsDbTdfFiler.h"
+#include "platform/host/ut/HsAssertionViolation.h"
+
+#include <gtest/gtest.h>
+
+#include <memory>
+#include <string>
+
+namespace {
+
+// Restates a change anywhere below it as a change of its own parameter 0, the way a record
+// reports a change deep in its tree; logs how a new object is made ready.
+class ZyrImpSampleHolder : public ZyrImpObj {
+    HSRX_DECLARE_MEMBERS(ZyrImpSampleHolder)
+
+public:
+    ZyrImpSampleHolder() { children.setParent(this); }
+
+    Hsys::ErrorStatus parameterChanged(ZyrParamContainer& container) override {
+        const ZyrParamInfo* last = container.last();
+        if (last != nullptr && last->paramClass() != ZyrImpSampleHolder::desc())
+            container.add(new ZyrParamInfo(0, ZyrImpSampleHolder::desc(), this));
+        return Hsys::eSuccess;
+    }
+    Hsys::ErrorStatus setToStandard(HsDbDatabase*) override {
+        calls += "standard ";
+        return Hsys::eSuccess;
+    }
+    Hsys::ErrorStatus subSetDatabaseDefaults(HsDbDatabase*) override {
+        calls += "defaults ";
+        return Hsys::eSuccess;
+    }
+
+    ZyrImpArray children;
+    std::string calls;
+};
+
+HSRX_DEFINE_MEMBERS(ZyrImpSampleHolder, ZyrImpObj, 0, hsrxInstantiateClass<ZyrImpSampleHolder>)
+
+TEST(ZyrImpObj, dbParentIsThePublicObjectAtTheTopOfTheNest) {
+    ZyrDbObject owner(false);
+    auto* holder = new ZyrImpSampleHolder;
+    owner.setImp(holder);
+    auto* leaf = new ZyrImpDictRecord;
+    ASSERT_EQ(holder->children.append(leaf), Hsys::eSuccess);
+    EXPECT_EQ(leaf->impParent(), &holder->children);
+    EXPECT_EQ(leaf->dbParent(), &owner);
+    EXPECT_EQ(holder->dbParent(), &owner);
+    EXPECT_EQ(ZyrImpDictRecord().dbParent(), nullptr);
+    EXPECT_EQ(leaf->database(), nullptr) << "the owner is in no database";
+
+    EXPECT_THROW(holder->setParent(static_cast<ZyrImpObj*>(leaf)), HsAssertionViolation);
+    EXPECT_THROW(holder->setParent(static_cast<ZyrImpObj*>(holder)), HsAssertionViolation);
+    EXPECT_EQ(holder->dbParent(), &owner) << "a refused parent changes nothing";
+}
+
+TEST(ZyrImpObj, aChangeTravelsUpAndIsNotedOnceInTheRecordsTerms) {
+    HsDbDatabase database;
+    auto* owner = new ZyrDbObject(false);
+    auto* holder = new ZyrImpSampleHolder;
+    owner->setImp(holder);
+    auto* leaf = new ZyrImpSampleRecord;
+    ASSERT_EQ(holder->children.append(leaf), Hsys::eSuccess);
+    HsDbObjectId id;
+    ASSERT_EQ(database.addHsDbObject(id, owner), Hsys::eSuccess);
+
+    ASSERT_EQ(leaf->setWidth(3.0), Hsys::eSuccess);
+    const std::vector<ZyrParamInfo>& notes = owner->parameterChanges();
+    ASSERT_EQ(notes.size(), 2u);
+    EXPECT_EQ(notes[0].paramClass(), ZyrImpSampleRecord::desc());
+    EXPECT_EQ(notes[0].paramId(), ZyrImpSampleRecord::kWidthParameter);
+    EXPECT_EQ(notes[1].paramClass(), ZyrImpSampleHolder::desc());
+    EXPECT_EQ(notes[1].paramId(), 0);
+
+    owner->clearParameterChanges();
+    holder->recordParameterChanged(5, ZyrImpSampleHolder::desc(), ZyrParamChangeFlag::kDisplay,
+                                   nullptr);
+    ASSERT_EQ(owner->parameterChanges().size(), 1u) << "the holder's own change is not restated";
+    EXPECT_EQ(owner->parameterChanges()[0].flags(), ZyrParamChangeFlag::kDisplay);
+    owner->close();
+}
+
+TEST(ZyrImpObj, referencesThatHaveNoObjectOrAnErasedOneAreCountedAndExplained) {
+    HsDbDatabase database;
+    HsDbObjectId erased;
+    auto* record = new ZyrDbSampleRecord;
+    ASSERT_EQ(database.addHsDbObject(erased, record), Hsys::eSuccess);
+    ASSERT_EQ(record->erase(), Hsys::eSuccess);
+    record->close();
+    HsDbObjectId missing;
+    ASSERT_EQ(database.getHsDbObjectId(missing, true, 999), Hsys::eSuccess);
+
+    ZyrSampleOverride override;
+    override.add(erased);
+    override.add(missing);
+    override.add(database.modelSpaceId());
+    int bad = 0;
+    EXPECT_EQ(override.verifyReferences(bad, true), Hsys::eSuccess);
+    EXPECT_EQ(bad, 2);
+    EXPECT_EQ(override.records().size(), 3u) << "this level cannot repair";
+    ZyrEnhancedReferenceAuditInfo info;
+    ASSERT_EQ(override.verifyReferences(info), Hsys::eSuccess);
+    ASSERT_EQ(info.badReferences().size(), 2u);
+    EXPECT_EQ(info.badReferences()[0].id, erased);
+    const std::wstring expected =
+        L"ZyrSampleOverride refers to " + std::to_wstring(erased.handle()) + L", which is erased";
+    EXPECT_EQ(info.badReferences()[0].message.str(), expected);
+    EXPECT_EQ(info.badReferences()[1].message.str(),
+              L"ZyrSampleOverride refers to 999, which has no object");
+}
+
+TEST(ZyrImpObj, aNewObjectTakesItsStandardsBeforeTheDatabaseDefaults) {
+    ZyrImpSampleHolder holder;
+    EXPECT_EQ(holder.initializeStandardsAndDefaults(nullptr), Hsys::eSuccess);
+    EXPECT_EQ(holder.calls, "standard defaults ");
+    HsArray<HsDbObjectId> materials;
+    EXPECT_EQ(holder.getMaterialComponents(materials), Hsys::eSuccess);
+    EXPECT_TRUE(materials.isEmpty());
+    EXPECT_EQ(holder.setMaterialComponents(materials), Hsys::eDoesNotApply);
+    ZyrDbObject bare(false);
+    EXPECT_EQ(bare.initializeStandardsAndDefaults(nullptr), Hsys::eNullPointer);
+}
+
+// ---- the owning array ----
+
+class ZyrImpArrayOf : public ::testing::Test {
+protected:
+    // An array of a record named name, a profile and a record named "second".
+    static void fill(ZyrImpArray& array, const wchar_t* name) {
+        auto* first = new ZyrImpDictRecord;
+        EXPECT_EQ(first->setName(name), Hsys::eSuccess);
+        auto* second = new ZyrImpDictRecord;
+        EXPECT_EQ(second->setName(L"second"), Hsys::eSuccess);
+        EXPECT_EQ(array.append(first), Hsys::eSuccess);
+        EXPECT_EQ(array.append(new ZyrGeProfile), Hsys::eSuccess);
+        EXPECT_EQ(array.append(second), Hsys::eSuccess);
+    }
+
+    static std::vector<std::wstring> describe(const ZyrImpArray& array) {
+        std::vector<std::wstring> entries;
+        for (int i = 0; i < array.length(); ++i) {
+            const ZyrImpDictRecord* record = ZyrImpDictRecord::cast(array.at(i));
+            entries.push_back(record != nullptr ? record->name().str()
+                                                : array.at(i)->isA()->name());
+        }
+        return entries;
+    }
+
+    HsDbDatabase filerDatabase{HsDb::kEmptyDatabase};
+};
+
+TEST_F(ZyrImpArrayOf, insertsOwnsAndHandsBackEntries) {
+    ZyrImpArray array;
+    fill(array, L"first");
+    auto* front = new ZyrImpDictRecord;
+    EXPECT_EQ(array.insertAt(0, front), Hsys::eSuccess);
+    EXPECT_EQ(array.insertAt(0, front), Hsys::eAlreadyPresent);
+    ZyrImpDictRecord refused;
+    EXPECT_EQ(array.insertAt(6, &refused), Hsys::eInvalidIndex) << "the caller keeps it";
+    EXPECT_EQ(refused.impParent(), nullptr);
+    EXPECT_EQ(array.insertAt(0, nullptr), Hsys::eNullPointer);
+    EXPECT_EQ(front->impParent(), &array);
+    EXPECT_EQ(describe(array),
+              (std::vector<std::wstring>{L"", L"first", L"ZyrGeProfile", L"second"}));
+
+    std::unique_ptr<ZyrImpObj> taken(array.removeAt(1));
+    ASSERT_NE(taken, nullptr);
+    EXPECT_EQ(taken->impParent(), nullptr);
+    EXPECT_EQ(array.removeAt(3), nullptr);
+    EXPECT_EQ(array.deleteAt(-1), Hsys::eInvalidIndex);
+    EXPECT_EQ(array.deleteAt(0), Hsys::eSuccess);
+    EXPECT_EQ(describe(array), (std::vector<std::wstring>{L"ZyrGeProfile", L"second"}));
+    array.deleteAll();
+    EXPECT_EQ(array.length(), 0);
+}
+
+TEST_F(ZyrImpArrayOf, mixedClassesRoundTripInBothFilers) {
+    ZyrImpArray source;
+    source.setTdfControlString(L"ZYRABSTRACTTREENODE");
+    fill(source, L"first");
+
+    HsDbBdfFiler writer;
+    ASSERT_EQ(source.bdfOutFields(&writer), Hsys::eSuccess);
+    ZyrImpArray binary;
+    HsDbBdfFiler reader(writer.bytes(), &filerDatabase);
+    ASSERT_EQ(binary.bdfInFields(&reader), Hsys::eSuccess);
+    EXPECT_EQ(describe(binary), describe(source));
+    EXPECT_EQ(binary.at(2)->impParent(), &binary);
+
+    HsDbTdfFiler textWriter(HsDb::kCopyFiler, true);
+    ASSERT_EQ(source.tdfOutFields(&textWriter), Hsys::eSuccess);
+    ZyrImpArray text;
+    text.setTdfControlString(L"ZYRABSTRACTTREENODE");
+    HsDbTdfFiler textReader(textWriter.items(), HsDb::kCopyFiler, true);
+    ASSERT_EQ(text.tdfInFields(&textReader), Hsys::eSuccess);
+    EXPECT_EQ(text.length(), 3);
+    EXPECT_NE(ZyrGeProfile::cast(text.at(1)), nullptr);
+}
+
+TEST_F(ZyrImpArrayOf, hostileStreamsLeaveTheArrayAsItWas) {
+    ZyrImpArray source;
+    fill(source, L"first");
+    HsDbBdfFiler writer;
+    ASSERT_EQ(source.bdfOutFields(&writer), Hsys::eSuccess);
+    const std::vector<std::uint8_t>& bytes = writer.bytes();
+    for (std::size_t length = 0; length < bytes.size(); ++length) {
+        ZyrImpArray array;
+        fill(array, L"kept");
+        HsDbBdfFiler reader({bytes.begin(), bytes.begin() + long(length)}, &filerDatabase);
+        EXPECT_EQ(array.bdfInFields(&reader), Hsys::eFilerError) << "length " << length;
+        EXPECT_EQ(describe(array)[0], L"kept") << "length " << length;
+    }
+    // Two version words, then a count far beyond the bytes.
+    ZyrImpArray array;
+    fill(array, L"kept");
+    HsDbBdfFiler huge({80, 0, 80, 0, 0xff, 0xff, 0xff, 0x0f, 0, 0}, &filerDatabase);
+    EXPECT_EQ(array.bdfInFields(&huge), Hsys::eFilerError);
+    EXPECT_EQ(array.length(), 3);
+    HsDbBdfFiler nullEntry({80, 0, 80, 0, 1, 0, 0, 0, 0, 0}, &filerDatabase);
+    EXPECT_EQ(array.bdfInFields(&nullEntry), Hsys::eFilerError) << "an array holds no nulls";
+    EXPECT_EQ(array.length(), 3);
+}
+
+TEST_F(ZyrImpArrayOf, textStreamsOfAnotherArrayOrAnUnknownClassAreRefused) {
+    ZyrImpArray source;
+    source.setTdfControlString(L"ONE");
+    fill(source, L"first");
+    HsDbTdfFiler writer(HsDb::kCopyFiler, true);
+    ASSERT_EQ(source.tdfOutFields(&writer), Hsys::eSuccess);
+    // Each case replaces one item of the written stream: control string, count, first class.
+    const struct {
+        const char* name;
+        std::size_t at;
+        HsDbTdfItem item;
+    } cases[] = {
+        {"another control string", 0, {ZyrImpArray::kControlGroupCode, L"TWO"}},
+        {"a count beyond the items", 1, {ZyrImpArray::kCountGroupCode, std::int32_t{40}}},
+        {"an unknown class", 2, {ZyrImpArray::kClassGroupCode, L"NoSuchClass"}},
+        {"a class name that is a number", 2, {ZyrImpArray::kClassGroupCode, std::int32_t{1}}},
+    };
+    for (const auto& c : cases) {
+        std::vector<HsDbTdfItem> items = writer.items();
+        items[c.at] = c.item;
+        ZyrImpArray array;
+        array.setTdfControlString(L"ONE");
+        fill(array, L"kept");
+        HsDbTdfFiler reader(items, HsDb::kCopyFiler, true);
+        EXPECT_EQ(array.tdfInFields(&reader), Hsys::eBadTdfSequence) << c.name;
+        EXPECT_FALSE(reader.errorMessage().empty()) << c.name;
+        EXPECT_EQ(describe(array)[0], L"kept") << c.name;
+    }
+}
+
+TEST_F(ZyrImpArrayOf, copyIsDeepAndOperationsReachEveryEntry) {
+    ZyrImpArray source;
+    fill(source, L"first");
+    ZyrImpArray copy;
+    ASSERT_EQ(copy.copyFrom(&source), Hsys::eSuccess);
+    EXPECT_EQ(describe(copy), describe(source));
+    EXPECT_NE(copy.at(0), source.at(0));
+    EXPECT_EQ(copy.at(0)->impParent(), &copy);
+    EXPECT_EQ(copy.copyFrom(&copy), Hsys::eSuccess);
+    ZyrImpDictRecord notAnArray;
+    EXPECT_EQ(copy.copyFrom(&notAnArray), Hsys::eBadArgument);
+
+    HsDbDatabase database;
+    ZyrImpArray holders;
+    auto* override = new ZyrSampleOverride;
+    override->add(database.modelSpaceId());
+    override->add(database.layerTableId());
+    ASSERT_EQ(holders.append(new ZyrImpSampleHolder), Hsys::eSuccess);
+    ASSERT_EQ(holders.append(override), Hsys::eSuccess);
+    ZyrObjReferenceMap map;
+    EXPECT_EQ(holders.getReferencedObjects(map), Hsys::eSuccess);
+    EXPECT_EQ(map.count(), 2);
+    EXPECT_EQ(holders.setToStandard(&database), Hsys::eSuccess);
+    EXPECT_EQ(ZyrImpSampleHolder::cast(holders.at(0))->calls, "standard ");
+    HsDbAuditInfo info;
+    EXPECT_EQ(holders.audit(&info), Hsys::eAuditNoParent) << "the first status that is not 0";
+}
+
+} // namespace

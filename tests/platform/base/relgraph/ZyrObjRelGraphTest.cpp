@@ -1,0 +1,333 @@
+// The relationship graph of a drawing: who refers to an object after changes, erases, undos,
+// hand-overs and a save and load, the objects of a class, and the graph's life beside its database.
+#include "tests/platform/base/obj/ZyrSampleObjects.h"
+
+#include "platform/base/app/ZyrAppHdx.h"
+#include "platform/base/app/ZyrBaseServices.h"
+#include "platform/base/relgraph/ZyrObjRelGraph.h"
+#include "platform/host/db/HsDbDatabase.h"
+#include "platform/host/db/HsDbObjectPointer.h"
+#include "platform/host/db/HsDbTransactionManager.h"
+#include "platform/host/ut/HsutUtf8.h"
+
+#include <gtest/gtest.h>
+
+#include <filesystem>
+#include <unistd.h>
+
+namespace {
+
+namespace fs = std::filesystem;
+
+AFX_EXTENSION_MODULE gExtension;
+
+// A record whose reader fails while gFailReads holds, so that a drawing stops loading at it.
+bool gFailReads = false;
+
+class ZyrDbUnreadable : public ZyrDbObject {
+    HSRX_DECLARE_MEMBERS(ZyrDbUnreadable)
+
+public:
+    Hsys::ErrorStatus bdfInFields(HsDbBdfFiler* filer) override {
+        const Hsys::ErrorStatus status = ZyrDbObject::bdfInFields(filer);
+        return gFailReads ? Hsys::eFilerError : status;
+    }
+};
+
+HSRX_DEFINE_MEMBERS(ZyrDbUnreadable, ZyrDbObject, 0, hsrxInstantiateClass<ZyrDbUnreadable>)
+
+constexpr int kRecord = ZyrObjReferenceInfo::kRecordRelation;
+constexpr int kMember = ZyrObjReferenceInfo::kMemberRelation;
+
+struct Referrer {
+    std::uint64_t handle;
+    int type;
+    friend bool operator==(const Referrer&, const Referrer&) = default;
+};
+
+std::ostream& operator<<(std::ostream& out, const Referrer& referrer) {
+    return out << referrer.handle << "/" << referrer.type;
+}
+
+class ZyrObjRelGraphOf : public ::testing::Test {
+protected:
+    void SetUp() override { ASSERT_EQ(ZyrBaseServices::registerService(&app), Hsys::eSuccess); }
+    void TearDown() override {
+        EXPECT_EQ(ZyrBaseServices::unRegisterService(&app), Hsys::eSuccess);
+        std::error_code ignored;
+        fs::remove(path, ignored);
+    }
+
+    static ZyrObjRelGraph* graphOf(HsDbDatabase& db) {
+        return ZyrBaseServices::service()->objRelGraph(&db);
+    }
+
+    HsDbObjectId add(HsDbObject* object) {
+        HsDbObjectId id;
+        EXPECT_EQ(database.addHsDbObject(id, object), Hsys::eSuccess);
+        object->close();
+        return id;
+    }
+    HsDbObjectId addRecord(const HsDbObjectId& style = HsDbObjectId()) {
+        auto* record = new ZyrDbSampleRecord;
+        EXPECT_EQ(record->sampleImp()->setStyleId(style), Hsys::eSuccess);
+        return add(record);
+    }
+    HsDbObjectId addShape(const std::vector<HsDbObjectId>& members,
+                          const std::vector<HsDbObjectId>& records = {}) {
+        auto* shape = new ZyrDbSampleShape;
+        for (const HsDbObjectId& member : members)
+            EXPECT_EQ(shape->shapeImp()->addMember(member), Hsys::eSuccess);
+        if (!records.empty()) {
+            auto* override = new ZyrSampleOverride;
+            for (const HsDbObjectId& record : records)
+                override->add(record);
+            EXPECT_EQ(shape->appendOverride(override), Hsys::eSuccess);
+        }
+        return add(shape);
+    }
+
+    static std::vector<Referrer> referrersOf(HsDbDatabase& db, const HsDbObjectId& id,
+                                             bool excludeErased = true) {
+        HsDbObjectPointer<HsDbObject> object(id, HsDb::kForRead, true);
+        EXPECT_TRUE(object) << Hsys::toString(object.openStatus());
+        HsArray<HsDbObjectId> ids;
+        HsArray<int> types;
+        EXPECT_EQ(graphOf(db)->getReferencesToMe(object.object(), ids, types, excludeErased),
+                  Hsys::eSuccess);
+        std::vector<Referrer> referrers;
+        for (int i = 0; i < ids.length(); ++i)
+            referrers.push_back({ids[i].handle(), types[i]});
+        return referrers;
+    }
+    std::vector<Referrer> referrersOf(const HsDbObjectId& id, bool excludeErased = true) {
+        return referrersOf(database, id, excludeErased);
+    }
+
+    static std::vector<std::uint64_t> objectsOf(HsDbDatabase& db, HsRxClass* cls, bool exact,
+                                                bool erased) {
+        HsArray<HsDbObjectId> ids;
+        EXPECT_EQ(graphOf(db)->getObjectsOfType(cls, ids, exact, erased), Hsys::eSuccess);
+        std::vector<std::uint64_t> handles;
+        for (const HsDbObjectId& id : ids)
+            handles.push_back(id.handle());
+        return handles;
+    }
+
+    void setErased(const HsDbObjectId& id, bool erased) {
+        HsDbObjectPointer<HsDbObject> object(id, HsDb::kForWrite, true);
+        ASSERT_EQ(object->erase(erased), Hsys::eSuccess);
+    }
+
+    ZyrAppHdx app{L"GraphTest80", nullptr, gExtension, L"GraphTest"};
+    HsDbDatabase database;
+    fs::path path;
+};
+
+TEST_F(ZyrObjRelGraphOf, answersWhoRefersInHandleOrderWithTheRelationType) {
+    const HsDbObjectId style = addRecord();
+    const HsDbObjectId member = addShape({});
+    const HsDbObjectId usesStyle = addRecord(style);
+    const HsDbObjectId holder = addShape({member, member}, {style, style});
+    const HsDbObjectId both = addShape({style}, {style});
+
+    EXPECT_EQ(referrersOf(style), (std::vector<Referrer>{{usesStyle.handle(), kRecord},
+                                                         {holder.handle(), kRecord},
+                                                         {both.handle(), kRecord},
+                                                         {both.handle(), kMember}}));
+    EXPECT_EQ(referrersOf(member), (std::vector<Referrer>{{holder.handle(), kMember}}));
+    EXPECT_TRUE(referrersOf(holder).empty());
+}
+
+TEST_F(ZyrObjRelGraphOf, followsEveryChangeOfAList) {
+    const HsDbObjectId member = addShape({});
+    const HsDbObjectId group = addShape({});
+    ASSERT_TRUE(referrersOf(member).empty()) << "the graph is built before the change";
+    {
+        HsDbObjectPointer<ZyrDbSampleShape> shape(group, HsDb::kForWrite);
+        ASSERT_EQ(shape->shapeImp()->addMember(member), Hsys::eSuccess);
+        EXPECT_EQ(referrersOf(member), (std::vector<Referrer>{{group.handle(), kMember}}))
+            << "answered while the group is still open for write";
+        ASSERT_EQ(shape->shapeImp()->removeMember(member), Hsys::eSuccess);
+        auto* override = new ZyrSampleOverride;
+        ASSERT_EQ(shape->appendOverride(override), Hsys::eSuccess);
+        override->add(member);
+    }
+    EXPECT_EQ(referrersOf(member), (std::vector<Referrer>{{group.handle(), kRecord}}));
+    {
+        HsDbObjectPointer<ZyrDbSampleShape> shape(group, HsDb::kForWrite);
+        ASSERT_EQ(shape->deleteOverrideAt(0), Hsys::eSuccess);
+    }
+    EXPECT_TRUE(referrersOf(member).empty());
+}
+
+TEST_F(ZyrObjRelGraphOf, erasedReferrersAreLeftOutOnlyWhenAsked) {
+    const HsDbObjectId member = addShape({});
+    const HsDbObjectId first = addShape({member});
+    const HsDbObjectId second = addShape({member});
+    setErased(first, true);
+    EXPECT_EQ(referrersOf(member), (std::vector<Referrer>{{second.handle(), kMember}}));
+    EXPECT_EQ(referrersOf(member, false),
+              (std::vector<Referrer>{{first.handle(), kMember}, {second.handle(), kMember}}));
+    setErased(first, false);
+    EXPECT_EQ(referrersOf(member).size(), 2u);
+}
+
+TEST_F(ZyrObjRelGraphOf, anAbortedTransactionTakesTheGraphBackWithTheObject) {
+    const HsDbObjectId member = addShape({});
+    const HsDbObjectId group = addShape({});
+    HsDbTransactionManager* transactions = database.transactionManager();
+    transactions->startTransaction();
+    HsDbObject* opened = nullptr;
+    ASSERT_EQ(transactions->getObject(opened, group, HsDb::kForWrite), Hsys::eSuccess);
+    ASSERT_EQ(ZyrDbSampleShape::cast(opened)->shapeImp()->addMember(member), Hsys::eSuccess);
+    const HsDbObjectId added = addShape({member});
+    EXPECT_EQ(referrersOf(member).size(), 2u);
+    ASSERT_EQ(transactions->abortTransaction(), Hsys::eSuccess);
+    EXPECT_TRUE(referrersOf(member).empty());
+    EXPECT_EQ(referrersOf(member, false), (std::vector<Referrer>{{added.handle(), kMember}}))
+        << "an object added in the transaction stays, erased";
+}
+
+TEST_F(ZyrObjRelGraphOf, aSavedAndLoadedDrawingAnswersTheSame) {
+    const HsDbObjectId style = addRecord();
+    const HsDbObjectId member = addShape({});
+    const HsDbObjectId group = addShape({member}, {style});
+    const HsDbObjectId erased = addShape({member});
+    setErased(erased, true);
+    path = fs::temp_directory_path() / ("zyr-relgraph-" + std::to_string(::getpid()) + ".zyrd");
+    const std::wstring file = hsutFromUtf8(path.string());
+    ASSERT_EQ(database.saveAs(file.c_str()), Hsys::eSuccess);
+
+    // One graph is made before the load and learns it as it happens; one after it.
+    HsDbDatabase before(HsDb::kEmptyDatabase);
+    ASSERT_NE(graphOf(before), nullptr);
+    ASSERT_EQ(before.readDrawingFile(file.c_str()), Hsys::eSuccess);
+    HsDbDatabase after(HsDb::kEmptyDatabase);
+    ASSERT_EQ(after.readDrawingFile(file.c_str()), Hsys::eSuccess);
+    for (HsDbDatabase* loaded : {&before, &after}) {
+        HsDbObjectId loadedMember;
+        HsDbObjectId loadedStyle;
+        ASSERT_EQ(loaded->getHsDbObjectId(loadedMember, false, member.handle()), Hsys::eSuccess);
+        ASSERT_EQ(loaded->getHsDbObjectId(loadedStyle, false, style.handle()), Hsys::eSuccess);
+        EXPECT_EQ(referrersOf(*loaded, loadedMember),
+                  (std::vector<Referrer>{{group.handle(), kMember}}));
+        EXPECT_EQ(referrersOf(*loaded, loadedMember, false),
+                  (std::vector<Referrer>{{group.handle(), kMember}, {erased.handle(), kMember}}));
+        EXPECT_EQ(referrersOf(*loaded, loadedStyle),
+                  (std::vector<Referrer>{{group.handle(), kRecord}}));
+        EXPECT_EQ(objectsOf(*loaded, ZyrDbSampleShape::desc(), true, false),
+                  (std::vector<std::uint64_t>{member.handle(), group.handle()}));
+    }
+}
+
+TEST_F(ZyrObjRelGraphOf, objectsOfAClassComeInHandleOrderAfterWhatTheListHeld) {
+    const HsDbObjectId shape = addShape({});
+    const HsDbObjectId record = addRecord();
+    const HsDbObjectId geo = add(new ZyrDbGeo);
+    const HsDbObjectId erased = addShape({});
+    setErased(erased, true);
+    const struct {
+        HsRxClass* cls;
+        bool exact;
+        bool erased;
+        std::vector<std::uint64_t> handles;
+    } cases[] = {
+        {ZyrDbSampleShape::desc(), true, false, {shape.handle()}},
+        {ZyrDbSampleShape::desc(), true, true, {shape.handle(), erased.handle()}},
+        {ZyrDbGeo::desc(), true, false, {geo.handle()}},
+        {ZyrDbGeo::desc(), false, false, {shape.handle(), geo.handle()}},
+        {ZyrDbGeo::desc(), false, true, {shape.handle(), geo.handle(), erased.handle()}},
+        {ZyrDbObject::desc(), false, false, {record.handle()}},
+        {ZyrDbDictRecord::desc(), true, false, {}},
+    };
+    for (const auto& c : cases)
+        EXPECT_EQ(objectsOf(database, c.cls, c.exact, c.erased), c.handles)
+            << hsutToUtf8(c.cls->name()) << " exact " << c.exact << " erased " << c.erased;
+
+    HsArray<HsDbObjectId> ids{HsDbObjectId()};
+    ASSERT_EQ(graphOf(database)->getObjectsOfType(ZyrDbSampleRecord::desc(), ids, true, false),
+              Hsys::eSuccess);
+    EXPECT_EQ(ids.length(), 2) << "appended, not cleared";
+    EXPECT_EQ(graphOf(database)->getObjectsOfType(nullptr, ids, true, false), Hsys::eNullPointer);
+}
+
+TEST_F(ZyrObjRelGraphOf, aHandOverGivesTheIdTheNewObjectsClassAndReferences) {
+    const HsDbObjectId style = addRecord();
+    const HsDbObjectId member = addShape({});
+    const HsDbObjectId id = addShape({member});
+    ASSERT_EQ(objectsOf(database, ZyrDbSampleShape::desc(), true, false).size(), 2u);
+    auto* successor = new ZyrDbSampleRecord;
+    ASSERT_EQ(successor->sampleImp()->setStyleId(style), Hsys::eSuccess);
+    {
+        HsDbObjectPointer<HsDbObject> old(id, HsDb::kForWrite);
+        ASSERT_EQ(old->handOverTo(successor), Hsys::eSuccess);
+        successor->close();
+        delete old.release();
+    }
+    EXPECT_EQ(objectsOf(database, ZyrDbSampleShape::desc(), true, false),
+              std::vector<std::uint64_t>{member.handle()});
+    EXPECT_TRUE(referrersOf(member).empty());
+    EXPECT_EQ(referrersOf(style), (std::vector<Referrer>{{id.handle(), kRecord}}));
+}
+
+TEST_F(ZyrObjRelGraphOf, referencesIntoAnotherDrawingAreNoEdges) {
+    HsDbDatabase other;
+    HsDbObjectId foreign;
+    auto* record = new ZyrDbSampleRecord;
+    ASSERT_EQ(other.addHsDbObject(foreign, record), Hsys::eSuccess);
+    record->close();
+    addShape({foreign});
+    EXPECT_TRUE(referrersOf(other, foreign).empty());
+    HsDbObjectPointer<HsDbObject> object(foreign, HsDb::kForRead);
+    HsArray<HsDbObjectId> ids;
+    HsArray<int> types;
+    EXPECT_EQ(graphOf(database)->getReferencesToMe(object.object(), ids, types, true),
+              Hsys::eBadArgument);
+    EXPECT_EQ(graphOf(database)->getReferencesToMe(nullptr, ids, types, true), Hsys::eNullPointer);
+}
+
+TEST_F(ZyrObjRelGraphOf, aGraphGoesWithItsDatabaseAndWithTheService) {
+    EXPECT_EQ(ZyrBaseServices::service()->objRelGraph(nullptr), nullptr);
+    auto doomed = std::make_unique<HsDbDatabase>();
+    const HsDbDatabase* address = doomed.get();
+    ZyrObjRelGraph* graph = graphOf(*doomed);
+    EXPECT_EQ(graphOf(*doomed), graph) << "one graph per database";
+    EXPECT_EQ(ZyrBaseServices::service()->findObjRelGraph(address), graph);
+    doomed.reset();
+    EXPECT_EQ(ZyrBaseServices::service()->findObjRelGraph(address), nullptr);
+
+    // A drawing that fails at its last object is dropped whole, and its graph with it.
+    addShape({addShape({})});
+    add(new ZyrDbUnreadable);
+    path = fs::temp_directory_path() / ("zyr-relgraph-" + std::to_string(::getpid()) + ".zyrd");
+    const std::wstring file = hsutFromUtf8(path.string());
+    ASSERT_EQ(database.saveAs(file.c_str()), Hsys::eSuccess);
+    HsDbDatabase failing(HsDb::kEmptyDatabase);
+    ZyrObjRelGraph* failingGraph = graphOf(failing);
+    gFailReads = true;
+    EXPECT_EQ(failing.readDrawingFile(file.c_str()), Hsys::eBadDrawingFile);
+    gFailReads = false;
+    EXPECT_TRUE(objectsOf(failing, HsDbObject::desc(), false, true).empty());
+    EXPECT_EQ(graphOf(failing), failingGraph);
+    ASSERT_EQ(failing.readDrawingFile(file.c_str()), Hsys::eSuccess);
+    EXPECT_EQ(objectsOf(failing, ZyrDbSampleShape::desc(), true, true).size(), 2u);
+}
+
+TEST_F(ZyrObjRelGraphOf, aLargeDrawingIsAnsweredInFull) {
+    constexpr int kGroups = 2000;
+    constexpr int kMembersEach = 10;
+    const HsDbObjectId style = addRecord();
+    std::vector<HsDbObjectId> members;
+    for (int i = 0; i < kMembersEach; ++i)
+        members.push_back(addShape({}, {style}));
+    ASSERT_NE(graphOf(database), nullptr);
+    for (int i = 0; i < kGroups; ++i)
+        addShape(members, {style});
+    EXPECT_EQ(referrersOf(style).size(), std::size_t{kGroups + kMembersEach});
+    EXPECT_EQ(referrersOf(members.back()).size(), std::size_t{kGroups});
+    EXPECT_EQ(objectsOf(database, ZyrDbSampleShape::desc(), true, false).size(),
+              std::size_t{kGroups + kMembersEach});
+}
+
+} // namespace
