@@ -41,17 +41,17 @@ TEST(ZyrCompSpec, locationsAreTheObjectThenItsStyleEachOnceAndFoundThroughTheFac
 
     HsDbObjectPointer<ZyrTestStyledEntity> entity(entityId, HsDb::kForRead);
     HsDbObjectPointer<ZyrDbDictRecord> style(standard, HsDb::kForRead);
-    ZyrCompSpec* spec = factory.compSpecFor(entity.object());
-    ASSERT_NE(spec, nullptr);
+    ZyrCompSpec* compSpec = factory.compSpecFor(entity.object());
+    ASSERT_NE(compSpec, nullptr);
     EXPECT_EQ(factory.compSpecFor(style.object()), nullptr);
     HsArray<HsDbObjectId> ids;
     ZyrRmCStringArray names;
-    EXPECT_EQ(spec->propSetLocations(entity.object(), ids, names), Hsys::eSuccess);
-    EXPECT_EQ(spec->propSetLocations(entity.object(), ids, names), Hsys::eAlreadyPresent);
+    EXPECT_EQ(compSpec->propSetLocations(entity.object(), ids, names), Hsys::eSuccess);
+    EXPECT_EQ(compSpec->propSetLocations(entity.object(), ids, names), Hsys::eAlreadyPresent);
     EXPECT_EQ(ids, (HsArray<HsDbObjectId>{entityId, standard}));
     EXPECT_EQ(names, (ZyrRmCStringArray{L"ZyrTestStyledEntity", L"Standard"}));
     HsArray<HsDbObjectId> styleIds; // another class stops after the base's location
-    EXPECT_EQ(spec->propSetLocations(style.object(), styleIds, names), Hsys::eSuccess);
+    EXPECT_EQ(compSpec->propSetLocations(style.object(), styleIds, names), Hsys::eSuccess);
     EXPECT_EQ(styleIds, HsArray<HsDbObjectId>{standard});
 
     EXPECT_EQ(ZyrCompSpec::addLocation(HsDbObjectId(), ids, names), Hsys::eNullId);

@@ -1,0 +1,192 @@
+#include "areacalc/calc/ZyrAreaCalculationStream.h"
+
+#include "areacalc/module/ZyrAreaCalculationHdxServices.h"
+#include "platform/base/zyrtl/zyrtlDelete.h"
+#include "platform/host/ut/HsAssertionViolation.h"
+#include "platform/host/ut/HsutConsole.h"
+
+#include <algorithm>
+
+ZyrCalculationNodeData::~ZyrCalculationNodeData() = default;
+
+bool StreamContentCheckerOidAndString::operator()(const ZyrCalculationNodeData* data) const {
+    return data != nullptr && data->objectId == m_objectId &&
+           data->algorithmClassName.str() == m_className.str();
+}
+
+void deleteTreeNode(ZyrCalculationNode*& node) {
+    if (node == nullptr) {
+        node = nullptr;
+        return;
+    }
+    // A copy, so that the walk does not depend on what deleting a child does to the list.
+    std::vector<ZyrCalculationNode*> children = node->children;
+    for (ZyrCalculationNode*& child : children)
+        deleteTreeNode(child);
+    delete node;
+    node = nullptr;
+}
+
+ZyrAreaCalculationStream::~ZyrAreaCalculationStream() {
+    reset();
+}
+
+void ZyrAreaCalculationStream::reset() {
+    // Tree and tables are independent: the tables go first, the forest last.
+    std::for_each(m_modifierDatas.begin(), m_modifierDatas.end(),
+                  zyrtl::deleteItem<ZyrModifierData*>());
+    m_modifierDatas.clear();
+    m_modifierPositions.clear();
+
+    // One record may stand in the table twice; it is deleted once.
+    NodeDataVector distinct = m_nodeDatas;
+    std::sort(distinct.begin(), distinct.end());
+    distinct.erase(std::unique(distinct.begin(), distinct.end()), distinct.end());
+    for (ZyrCalculationNodeData* data : distinct)
+        delete data;
+    m_nodeDatas.clear();
+
+    // The bitmaps belong to whoever made them.
+    std::for_each(m_nodeHeaders.begin(), m_nodeHeaders.end(),
+                  zyrtl::deleteItem<ZyrCalculationNodeHeader*>());
+    m_nodeHeaders.clear();
+    m_headerPositions.clear();
+
+    for (ZyrCalculationNode*& root : m_roots)
+        deleteTreeNode(root);
+}
+
+ZyrCalculationNodeHeader*
+ZyrAreaCalculationStream::nodeHeader(const ZyrCalculationNode& node) const {
+    return m_nodeHeaders[static_cast<size_t>(node.headerIndex)];
+}
+
+int ZyrAreaCalculationStream::nNodeDatas(const ZyrCalculationNode& node) const {
+    return static_cast<int>(node.nodeDataIndices.size());
+}
+
+ZyrCalculationNodeData* ZyrAreaCalculationStream::nodeDataAt(const ZyrCalculationNode& node,
+                                                             int i) const {
+    return m_nodeDatas[static_cast<size_t>(node.nodeDataIndices[static_cast<size_t>(i)])];
+}
+
+int ZyrAreaCalculationStream::nModifierBlocks(const ZyrCalculationNodeData& data) const {
+    return static_cast<int>(data.modifierBlocks.size());
+}
+
+const ZyrModifierBlock&
+ZyrAreaCalculationStream::modifierBlockAt(const ZyrCalculationNodeData& data, int i) const {
+    return data.modifierBlocks[static_cast<size_t>(i)];
+}
+
+ZyrModifierData* ZyrAreaCalculationStream::modifierData(const ZyrModifierBlock& block) const {
+    return m_modifierDatas[static_cast<size_t>(block.modifierIndex)];
+}
+
+namespace {
+
+bool findFirstPosition(const std::unordered_map<HsDbObjectId, int>& positions,
+                       const HsDbObjectId& objectId, int& index) {
+    const auto found = positions.find(objectId);
+    if (found == positions.end())
+        return false;
+    index = found->second;
+    return true;
+}
+
+} // namespace
+
+bool ZyrAreaCalculationStream::hasNodeHeaderFor(const HsDbObjectId& objectId, int& index) const {
+    return findFirstPosition(m_headerPositions, objectId, index);
+}
+
+bool ZyrAreaCalculationStream::hasModifierDataFor(const HsDbObjectId& objectId, int& index) const {
+    return findFirstPosition(m_modifierPositions, objectId, index);
+}
+
+bool ZyrAreaCalculationStream::hasNodeDataFor(const HsDbObjectId& objectId,
+                                              const ZyrRmCString& algorithmClassName,
+                                              int& index) const {
+    const auto found = std::find_if(m_nodeDatas.begin(), m_nodeDatas.end(),
+                                    StreamContentCheckerOidAndString(objectId, algorithmClassName));
+    if (found == m_nodeDatas.end())
+        return false;
+    index = static_cast<int>(found - m_nodeDatas.begin());
+    return true;
+}
+
+void ZyrAreaCalculationStream::dumpToHsysTxtWindow() const {
+    hsutPrintf(L"\nArea Calculation\n\n");
+    const ZyrPrimitiveExpressionHandlerFactory* factory = nullptr;
+    if (ZyrAreaCalculationHdxServices* services = ZyrAreaCalculationHdxServices::service())
+        factory = services->expressionHandlerFactory();
+    int position = 1;
+    for (const ZyrCalculationNode* root : m_roots) {
+        hsutPrintf(L"\nRoot node %d\n", position++);
+        dumpNode(*root, factory);
+    }
+    hsutPrintf(L"\n");
+}
+
+void ZyrAreaCalculationStream::dumpNode(const ZyrCalculationNode& node,
+                                        const ZyrPrimitiveExpressionHandlerFactory* factory) const {
+    const ZyrCalculationNodeHeader* header = nodeHeader(node);
+    hsutPrintf(L"\n%s", header->name.GetString());
+    if (!header->description.IsEmpty())
+        hsutPrintf(L"(%s)", header->description.GetString());
+    for (int index : node.nodeDataIndices)
+        dumpNodeData(*m_nodeDatas[static_cast<size_t>(index)]);
+    for (const ZyrCalculationNode* child : node.children)
+        dumpNode(*child, factory);
+}
+
+void ZyrAreaCalculationStream::dumpNodeData(const ZyrCalculationNodeData& data) const {
+    hsutPrintf(L"\n%s %f", data.grossName.GetString(), data.grossValue);
+    hsutPrintf(L"\n%s %f", data.netName.GetString(), data.netValue);
+    if (const auto* decomposed = dynamic_cast<const ZyrDecomposedCalculationNodeData*>(&data))
+        hsutPrintf(L"\n    %s %f", decomposed->decomposedName.GetString(),
+                   decomposed->decomposedValue);
+    int position = 0;
+    for (const ZyrModifierBlock& block : data.modifierBlocks) {
+        const ZyrModifierData* modifier = modifierData(block);
+        hsutPrintf(L"\n    %d. %s (%s)  Before %f after %f", position++, modifier->name.GetString(),
+                   modifier->description.GetString(), block.beforeValue, block.afterValue);
+    }
+}
+
+void ZyrAreaCalculationStreamWriter::appendRoot(ZyrCalculationNode* node) {
+    if (node != nullptr)
+        node->parent = nullptr;
+    m_stream.m_roots.push_back(node);
+}
+
+namespace {
+
+template <class Record>
+int appendIndexed(std::vector<Record*>& table, std::unordered_map<HsDbObjectId, int>& positions,
+                  Record* record, const char* what) {
+    if (record == nullptr)
+        throw HsAssertionViolation(std::string("a calculation stream takes no null ") + what);
+    const int index = static_cast<int>(table.size());
+    table.push_back(record);
+    // The first record of an object stays the one that is found.
+    positions.try_emplace(record->objectId, index);
+    return index;
+}
+
+} // namespace
+
+int ZyrAreaCalculationStreamWriter::appendNodeHeader(ZyrCalculationNodeHeader* header) {
+    return appendIndexed(m_stream.m_nodeHeaders, m_stream.m_headerPositions, header, "header");
+}
+
+int ZyrAreaCalculationStreamWriter::appendNodeData(ZyrCalculationNodeData* data) {
+    const int index = static_cast<int>(m_stream.m_nodeDatas.size());
+    m_stream.m_nodeDatas.push_back(data);
+    return index;
+}
+
+int ZyrAreaCalculationStreamWriter::appendModifierData(ZyrModifierData* data) {
+    return appendIndexed(m_stream.m_modifierDatas, m_stream.m_modifierPositions, data,
+                         "modifier record");
+}

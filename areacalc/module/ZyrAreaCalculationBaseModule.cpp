@@ -1,0 +1,3 @@
+#include "areacalc/module/ZyrAreaCalculationBaseModule.h"
+
+HsModuleHandle _hdllInstance = nullptr;

@@ -1,0 +1,26 @@
+#include "areacalc/objects/ZyrCompSpecTemplate.h"
+
+#include "areacalc/module/ZyrAreaCalculationClassRegistration.h"
+#include "areacalc/objects/ZyrDbArea.h"
+#include "areacalc/objects/ZyrDbAreaStyle.h"
+
+template <class Object, class Style>
+HsRxClass* ZyrCompSpecTemplate<Object, Style>::gpDesc = nullptr;
+
+template <class Object, class Style> HsRxClass* ZyrCompSpecTemplate<Object, Style>::rxInit() {
+    return ZyrAreaCalculationClassRegistration::rxInit(gpDesc, kClassName, ZyrCompSpec::desc(), 80,
+                                                       kFactory);
+}
+
+HsRxObject* makeZyrCompSpecArea() {
+    return new ZyrCompSpecArea();
+}
+
+template <> const wchar_t* const ZyrCompSpecArea::kClassName = L"ZyrCompSpecArea";
+template <> const HsRxClass::PseudoConstructor ZyrCompSpecArea::kFactory = makeZyrCompSpecArea;
+template class ZyrCompSpecTemplate<ZyrDbArea, ZyrDbAreaStyle>;
+
+ZyrRxClassDecorator gZyrDecoratorZyrCompSpecArea(typeid(ZyrCompSpecArea), typeid(ZyrCompSpec),
+                                                 &ZyrCompSpecArea::rxInit, &ZyrCompSpecArea::desc,
+                                                 &_hdllInstance, ZyrRxClassDecorator::kNoText,
+                                                 ZyrRxClassDecorator::kNoText);

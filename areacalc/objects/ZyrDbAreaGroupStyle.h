@@ -1,0 +1,27 @@
+// Area group styles: the dictionary records that area groups refer to, which carry what the
+// groups of one kind share.
+#pragma once
+
+#include "areacalc/objects/ZyrDbPair.h"
+#include "areacalc/objects/ZyrImpPair.h"
+#include "platform/base/obj/ZyrDbDictRecord.h"
+#include "platform/base/obj/ZyrImpDictRecord.h"
+
+// A style is its name and what ZyrImpDictRecord holds; it adds no field of its own. Binary
+// filing after ZyrImpDictRecord's: int16 80 alone.
+class ZyrImpAreaGroupStyle : public ZyrImpPair<ZyrImpAreaGroupStyle, ZyrImpDictRecord> {
+    ZYR_AREACALC_DECLARE_MEMBERS(ZyrImpAreaGroupStyle)
+};
+
+class ZyrDbAreaGroupStyle
+    : public ZyrDbPair<ZyrDbAreaGroupStyle, ZyrDbDictRecord, ZyrImpAreaGroupStyle> {
+    ZYR_AREACALC_DECLARE_FILED_MEMBERS(ZyrDbAreaGroupStyle)
+
+public:
+    static constexpr const wchar_t* kClassIdWord = L"ZyrAreaGroupStyle";
+
+    using ZyrDbPair::ZyrDbPair;
+
+    ZyrImpAreaGroupStyle* areaGroupStyleImp() { return pairImp(); }
+    const ZyrImpAreaGroupStyle* areaGroupStyleImp() const { return pairImp(); }
+};

@@ -1,0 +1,177 @@
+// The calculation stream: its lookups against a search from the front of the tables, reset with
+// its null roots, shared headers, and the exact console dump.
+#include "areacalc/calc/ZyrAreaCalculationStream.h"
+#include "platform/host/db/HsDbDatabase.h"
+#include "platform/host/ut/HsutConsole.h"
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <random>
+
+namespace {
+
+class ZyrAreaCalculationStreamTest : public testing::Test {
+protected:
+    HsDbObjectId id(std::uint64_t handle) {
+        HsDbObjectId result;
+        EXPECT_EQ(database.getHsDbObjectId(result, true, handle), Hsys::eSuccess);
+        return result;
+    }
+    static ZyrCalculationNode* node(int headerIndex, std::vector<int> dataIndices = {}) {
+        return new ZyrCalculationNode{nullptr, headerIndex, {}, std::move(dataIndices)};
+    }
+    int header(const wchar_t* name, std::uint64_t handle, const wchar_t* description = L"") {
+        return writer.appendNodeHeader(
+            new ZyrCalculationNodeHeader{L"ZyrDbArea", id(handle), name, description, nullptr});
+    }
+    int data(std::uint64_t handle, const wchar_t* algorithm, double gross = 30, double net = 27) {
+        auto* made = new ZyrCalculationNodeData;
+        made->objectId = id(handle);
+        made->algorithmClassName = algorithm;
+        made->grossName = L"Area";
+        made->grossValue = gross;
+        made->netName = L"Net area";
+        made->netValue = net;
+        return writer.appendNodeData(made);
+    }
+
+    HsDbDatabase database;
+    ZyrAreaCalculationStream stream;
+    ZyrAreaCalculationStreamWriter writer{stream};
+};
+
+template <class Table> int searchFromTheFront(const Table& table, const HsDbObjectId& objectId) {
+    const auto found = std::find_if(table.begin(), table.end(), [&](const auto* record) {
+        return record->objectId == objectId;
+    });
+    return found != table.end() ? static_cast<int>(found - table.begin()) : -1;
+}
+
+TEST_F(ZyrAreaCalculationStreamTest, lookupsAnswerWhatASearchFromTheFrontAnswers) {
+    std::mt19937 random(20240611);
+    std::uniform_int_distribution<std::uint64_t> handles(1, 40);
+    // Two rounds: the lookups follow the tables through a reset as well.
+    for (int round = 0; round < 2; ++round) {
+        stream.reset();
+        for (int i = 0; i < 300; ++i) {
+            header(L"area", handles(random));
+            writer.appendModifierData(new ZyrModifierData{L"m", L"", id(handles(random)), L"x"});
+        }
+        for (std::uint64_t handle = 1; handle <= 45; ++handle) {
+            const int expectedHeader = searchFromTheFront(stream.nodeHeaderVector(), id(handle));
+            const int expectedModifier =
+                searchFromTheFront(stream.modifierDataVector(), id(handle));
+            int headerIndex = -1;
+            int modifierIndex = -1;
+            EXPECT_EQ(stream.hasNodeHeaderFor(id(handle), headerIndex), expectedHeader >= 0);
+            EXPECT_EQ(stream.hasModifierDataFor(id(handle), modifierIndex), expectedModifier >= 0);
+            EXPECT_EQ(headerIndex, expectedHeader) << handle;
+            EXPECT_EQ(modifierIndex, expectedModifier) << handle;
+        }
+    }
+}
+
+TEST_F(ZyrAreaCalculationStreamTest, objectPushedTwiceSharesItsHeaderButNotItsData) {
+    header(L"Hall", 8);
+    const int kitchen = header(L"Kitchen", 7);
+    writer.appendRoot(node(kitchen, {data(7, L"Area")}));
+    writer.appendRoot(node(kitchen, {data(7, L"Area"), data(7, L"Perimeter")}));
+
+    int index = -1;
+    EXPECT_TRUE(stream.hasNodeHeaderFor(id(7), index));
+    EXPECT_EQ(index, 1);
+    const ZyrCalculationNode& first = *stream.roots()[0];
+    const ZyrCalculationNode& second = *stream.roots()[1];
+    EXPECT_EQ(stream.nodeHeader(first), stream.nodeHeader(second));
+    EXPECT_EQ(stream.nNodeDatas(first), 1);
+    EXPECT_EQ(stream.nNodeDatas(second), 2);
+    EXPECT_NE(stream.nodeDataAt(first, 0), stream.nodeDataAt(second, 0));
+
+    // Node data are found by object and by the exact algorithm name, first in table order.
+    const struct {
+        const wchar_t* algorithm;
+        int index;
+    } cases[] = {{L"Area", 0}, {L"Perimeter", 2}, {L"area", -1}, {L"Area ", -1}, {L"Are", -1}};
+    for (const auto& c : cases) {
+        index = -1;
+        EXPECT_EQ(stream.hasNodeDataFor(id(7), c.algorithm, index), c.index >= 0) << c.algorithm;
+        EXPECT_EQ(index, c.index) << c.algorithm;
+    }
+    EXPECT_FALSE(stream.hasNodeDataFor(id(8), L"Area", index));
+}
+
+// Counts its deletions, so that a record standing twice in the table is seen deleted once.
+struct CountedData : ZyrCalculationNodeData {
+    explicit CountedData(int& deletions) : deletions(deletions) {}
+    ~CountedData() override { ++deletions; }
+    int& deletions;
+};
+
+TEST_F(ZyrAreaCalculationStreamTest, resetEmptiesTheTablesAndLeavesNullRootsBehind) {
+    int deletions = 0;
+    auto* twice = new CountedData(deletions);
+    writer.appendNodeData(twice);
+    writer.appendNodeData(twice);
+    writer.appendNodeData(nullptr);
+    const int floor = header(L"Floor", 1);
+    ZyrCalculationNode* root = node(floor);
+    root->children = {node(header(L"Room", 2)), node(floor)};
+    root->children[0]->children = {node(floor)};
+    writer.appendRoot(root);
+    writer.appendRoot(node(floor));
+    writer.appendModifierData(new ZyrModifierData{L"Roof", L"", id(9), L"x"});
+
+    stream.reset();
+    EXPECT_EQ(deletions, 1);
+    EXPECT_TRUE(stream.nodeHeaderVector().empty());
+    EXPECT_TRUE(stream.nodeDataVector().empty());
+    EXPECT_TRUE(stream.modifierDataVector().empty());
+    EXPECT_EQ(stream.roots(), (ZyrAreaCalculationStream::NodeVector{nullptr, nullptr}));
+    int index = -1;
+    EXPECT_FALSE(stream.hasModifierDataFor(id(9), index));
+
+    // Used again: new roots come behind the null slots, and lookups start afresh.
+    EXPECT_EQ(header(L"Floor", 1), 0);
+    writer.appendRoot(node(0));
+    EXPECT_EQ(stream.roots().size(), 3u);
+    EXPECT_TRUE(stream.hasNodeHeaderFor(id(1), index));
+    EXPECT_EQ(index, 0);
+}
+
+TEST_F(ZyrAreaCalculationStreamTest, dumpPrintsTheForestWithValuesPiecesAndModifiers) {
+    ZyrCalculationNode* floor = node(header(L"Floor", 1, L"Ground floor"), {data(1, L"Area")});
+    auto* proof = new ZyrDecomposedCalculationNodeData;
+    proof->grossName = L"Area";
+    proof->grossValue = 30;
+    proof->netName = L"Net area";
+    proof->netValue = 27;
+    proof->decomposedName = L"Area proof";
+    proof->decomposedValue = 29.5;
+    proof->units.push_back({L"A1", 29.5, {5.0, 11.8}, 0});
+    proof->modifierBlocks = {{0, L"_AREA_VALUE_", 30, L"_AREA_VALUE_", 28.5},
+                             {1, L"_AREA_VALUE_", 28.5, L"_AREA_VALUE_", 27}};
+    writer.appendModifierData(
+        new ZyrModifierData{L"Roof", L"Sloping", id(2), L"_AREA_VALUE_*0.95"});
+    writer.appendModifierData(new ZyrModifierData{L"Cut", L"", id(3), L"_AREA_VALUE_-1.5"});
+    floor->children.push_back(node(header(L"Room", 2), {writer.appendNodeData(proof)}));
+    writer.appendRoot(floor);
+
+    HsutConsoleCapture console;
+    stream.dumpToHsysTxtWindow();
+    EXPECT_EQ(console.text(), L"\nArea Calculation\n\n"
+                              L"\nRoot node 1\n"
+                              L"\nFloor(Ground floor)"
+                              L"\nArea 30.000000\nNet area 27.000000"
+                              L"\nRoom"
+                              L"\nArea 30.000000\nNet area 27.000000"
+                              L"\n    Area proof 29.500000"
+                              L"\n    0. Roof (Sloping)  Before 30.000000 after 28.500000"
+                              L"\n    1. Cut ()  Before 28.500000 after 27.000000"
+                              L"\n");
+    console.clear();
+    ZyrAreaCalculationStream().dumpToHsysTxtWindow();
+    EXPECT_EQ(console.text(), L"\nArea Calculation\n\n\n");
+}
+
+} // namespace
