@@ -3,8 +3,7 @@
 #include "platform/base/geom/ZyrGeProfile.h"
 
 #include "platform/base/geom/ZyrGeBoundBox3d.h"
-#include "platform/base/obj/ZyrConvertLegacyExtendData.h"
-#include "platform/base/obj/ZyrRegisterRelgraph.h"
+#include "platform/base/obj/ZyrLevelFiling.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
 #include "platform/host/ge/HsGeMatrix3d.h"
 #include "platform/host/rx/HsRxClass.h"
@@ -164,9 +163,8 @@ double ZyrGeProfile::area(double tol) const {
 
 bool ZyrGeProfile::isValidProfile(bool checkCrossings) const {
     const HsGeTol& tol = HsGeContext::gTol;
-    const bool ringsValid = std::all_of(m_rings.begin(), m_rings.end(), [&](const auto& ring) {
-        return isValidRing(*ring, tol);
-    });
+    const bool ringsValid = std::all_of(m_rings.begin(), m_rings.end(),
+                                        [&](const auto& ring) { return isValidRing(*ring, tol); });
     return ringsValid && !(checkCrossings && hasCrossings(tol));
 }
 
@@ -272,13 +270,12 @@ void ZyrGeProfile::updateExtents() {
 }
 
 Hsys::ErrorStatus ZyrGeProfile::bdfOutFields(HsDbBdfFiler* filer) const {
-    if (filer == nullptr) {
-        return Hsys::eNullPointer;
-    }
-    if (const Hsys::ErrorStatus status = ZyrImpObj::bdfOutFields(filer); status != Hsys::eSuccess) {
-        return status;
-    }
-    bdfOutVersion(filer);
+    return Zyr::bdfOutLevel(
+        filer, [&] { return ZyrImpObj::bdfOutFields(filer); }, [&] { return bdfOutVersion(filer); },
+        [&] { return bdfOutOwnFields(filer); });
+}
+
+Hsys::ErrorStatus ZyrGeProfile::bdfOutOwnFields(HsDbBdfFiler* filer) const {
     filer->writeUInt32(static_cast<std::uint32_t>(m_rings.size()));
     for (const auto& ring : m_rings) {
         filer->writeUInt32(static_cast<std::uint32_t>(ring->segmentCount()));
@@ -293,17 +290,12 @@ Hsys::ErrorStatus ZyrGeProfile::bdfOutFields(HsDbBdfFiler* filer) const {
 }
 
 Hsys::ErrorStatus ZyrGeProfile::bdfInFields(HsDbBdfFiler* filer) {
-    if (filer == nullptr) {
-        return Hsys::eNullPointer;
-    }
-    ZyrRegisterRelgraph relgraph(filer, this, ZyrGeProfile::desc());
-    ZyrConvertLegacyExtendData legacy(filer, this, ZyrGeProfile::desc());
-    if (const Hsys::ErrorStatus status = ZyrImpObj::bdfInFields(filer); status != Hsys::eSuccess) {
-        return status;
-    }
-    if (const Hsys::ErrorStatus status = bdfInVersion(filer); status != Hsys::eSuccess) {
-        return status;
-    }
+    return Zyr::bdfInLevel(
+        filer, this, ZyrGeProfile::desc(), [&] { return ZyrImpObj::bdfInFields(filer); },
+        [&] { return bdfInVersion(filer); }, [&] { return bdfInOwnFields(filer); });
+}
+
+Hsys::ErrorStatus ZyrGeProfile::bdfInOwnFields(HsDbBdfFiler* filer) {
     std::uint32_t ringTotal = 0;
     if (readCount(filer, kMinFiledRingSize, ringTotal) != Hsys::eSuccess) {
         return filer->filerStatus();

@@ -79,6 +79,9 @@ public:
     void updateExtents();
 
 private:
+    // This level's own fields, after its base's and its version word.
+    Hsys::ErrorStatus bdfInOwnFields(HsDbBdfFiler* filer);
+    Hsys::ErrorStatus bdfOutOwnFields(HsDbBdfFiler* filer) const;
     bool hasCrossings(const HsGeTol& tol) const;
     static Hsys::ErrorStatus readRing(HsDbBdfFiler* filer, ZyrGeRing& ring);
 

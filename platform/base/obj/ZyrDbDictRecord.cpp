@@ -1,8 +1,7 @@
 #include "platform/base/obj/ZyrDbDictRecord.h"
 
-#include "platform/base/obj/ZyrConvertLegacyExtendData.h"
 #include "platform/base/obj/ZyrImpDictRecord.h"
-#include "platform/base/obj/ZyrRegisterRelgraph.h"
+#include "platform/base/obj/ZyrLevelFiling.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
 #include "platform/host/rx/HsRxClass.h"
 
@@ -16,19 +15,15 @@ ZyrDbDictRecord::ZyrDbDictRecord(bool createImp) : ZyrDbObject(false) {
 ZyrDbDictRecord::~ZyrDbDictRecord() = default;
 
 Hsys::ErrorStatus ZyrDbDictRecord::bdfInFields(HsDbBdfFiler* filer) {
-    ZyrRegisterRelgraph relgraph(filer, this, ZyrDbDictRecord::desc());
-    ZyrConvertLegacyExtendData legacy(filer, this, ZyrDbDictRecord::desc());
-    if (const Hsys::ErrorStatus status = ZyrDbObject::bdfInFields(filer); status != Hsys::eSuccess)
-        return status;
-    if (const Hsys::ErrorStatus status = bdfInVersion(filer); status != Hsys::eSuccess)
-        return status;
-    return filer->filerStatus();
+    return Zyr::bdfInLevel(
+        filer, this, ZyrDbDictRecord::desc(), [&] { return ZyrDbObject::bdfInFields(filer); },
+        [&] { return bdfInVersion(filer); }, Zyr::noOwnFields);
 }
 
 Hsys::ErrorStatus ZyrDbDictRecord::bdfOutFields(HsDbBdfFiler* filer) const {
-    if (const Hsys::ErrorStatus status = ZyrDbObject::bdfOutFields(filer); status != Hsys::eSuccess)
-        return status;
-    return bdfOutVersion(filer);
+    return Zyr::bdfOutLevel(
+        filer, [&] { return ZyrDbObject::bdfOutFields(filer); },
+        [&] { return bdfOutVersion(filer); }, Zyr::noOwnFields);
 }
 
 ZyrImpDictRecord* ZyrDbDictRecord::recordImp() {

@@ -1,8 +1,7 @@
 #include "platform/base/obj/ZyrDbGeo.h"
 
-#include "platform/base/obj/ZyrConvertLegacyExtendData.h"
 #include "platform/base/obj/ZyrImpGeo.h"
-#include "platform/base/obj/ZyrRegisterRelgraph.h"
+#include "platform/base/obj/ZyrLevelFiling.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
 #include "platform/host/rx/HsRxClass.h"
 
@@ -16,19 +15,15 @@ ZyrDbGeo::ZyrDbGeo(bool createImp) : ZyrDbEntity(false) {
 ZyrDbGeo::~ZyrDbGeo() = default;
 
 Hsys::ErrorStatus ZyrDbGeo::bdfInFields(HsDbBdfFiler* filer) {
-    ZyrRegisterRelgraph relgraph(filer, this, ZyrDbGeo::desc());
-    ZyrConvertLegacyExtendData legacy(filer, this, ZyrDbGeo::desc());
-    if (const Hsys::ErrorStatus status = ZyrDbEntity::bdfInFields(filer); status != Hsys::eSuccess)
-        return status;
-    if (const Hsys::ErrorStatus status = bdfInVersion(filer); status != Hsys::eSuccess)
-        return status;
-    return filer->filerStatus();
+    return Zyr::bdfInLevel(
+        filer, this, ZyrDbGeo::desc(), [&] { return ZyrDbEntity::bdfInFields(filer); },
+        [&] { return bdfInVersion(filer); }, Zyr::noOwnFields);
 }
 
 Hsys::ErrorStatus ZyrDbGeo::bdfOutFields(HsDbBdfFiler* filer) const {
-    if (const Hsys::ErrorStatus status = ZyrDbEntity::bdfOutFields(filer); status != Hsys::eSuccess)
-        return status;
-    return bdfOutVersion(filer);
+    return Zyr::bdfOutLevel(
+        filer, [&] { return ZyrDbEntity::bdfOutFields(filer); },
+        [&] { return bdfOutVersion(filer); }, Zyr::noOwnFields);
 }
 
 ZyrImpGeo* ZyrDbGeo::geoImp() {

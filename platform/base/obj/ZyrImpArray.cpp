@@ -1,8 +1,7 @@
 #include "platform/base/obj/ZyrImpArray.h"
 
-#include "platform/base/obj/ZyrConvertLegacyExtendData.h"
 #include "platform/base/obj/ZyrFiling.h"
-#include "platform/base/obj/ZyrRegisterRelgraph.h"
+#include "platform/base/obj/ZyrLevelFiling.h"
 #include "platform/base/zyrtl/zyrtlDelete.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
 #include "platform/host/filer/HsDbTdfFiler.h"
@@ -74,12 +73,12 @@ Hsys::ErrorStatus ZyrImpArray::copyFrom(const HsRxObject* other) {
 }
 
 Hsys::ErrorStatus ZyrImpArray::bdfInFields(HsDbBdfFiler* filer) {
-    ZyrRegisterRelgraph relgraph(filer, this, ZyrImpArray::desc());
-    ZyrConvertLegacyExtendData legacy(filer, this, ZyrImpArray::desc());
-    if (const Hsys::ErrorStatus status = ZyrImpObj::bdfInFields(filer); status != Hsys::eSuccess)
-        return status;
-    if (const Hsys::ErrorStatus status = bdfInVersion(filer); status != Hsys::eSuccess)
-        return status;
+    return Zyr::bdfInLevel(
+        filer, this, ZyrImpArray::desc(), [&] { return ZyrImpObj::bdfInFields(filer); },
+        [&] { return bdfInVersion(filer); }, [&] { return bdfInOwnFields(filer); });
+}
+
+Hsys::ErrorStatus ZyrImpArray::bdfInOwnFields(HsDbBdfFiler* filer) {
     std::uint32_t count = 0;
     if (filer->readUInt32(count) != Hsys::eSuccess)
         return filer->filerStatus();
@@ -106,9 +105,12 @@ Hsys::ErrorStatus ZyrImpArray::bdfInFields(HsDbBdfFiler* filer) {
 }
 
 Hsys::ErrorStatus ZyrImpArray::bdfOutFields(HsDbBdfFiler* filer) const {
-    if (const Hsys::ErrorStatus status = ZyrImpObj::bdfOutFields(filer); status != Hsys::eSuccess)
-        return status;
-    bdfOutVersion(filer);
+    return Zyr::bdfOutLevel(
+        filer, [&] { return ZyrImpObj::bdfOutFields(filer); }, [&] { return bdfOutVersion(filer); },
+        [&] { return bdfOutOwnFields(filer); });
+}
+
+Hsys::ErrorStatus ZyrImpArray::bdfOutOwnFields(HsDbBdfFiler* filer) const {
     filer->writeUInt32(static_cast<std::uint32_t>(m_entries.size()));
     for (const ZyrImpObj* entry : m_entries)
         if (const Hsys::ErrorStatus status =

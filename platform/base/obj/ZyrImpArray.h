@@ -67,6 +67,9 @@ public:
     void deleteAll();
 
 private:
+    // This level's own fields, after its base's and its version word.
+    Hsys::ErrorStatus bdfInOwnFields(HsDbBdfFiler* filer);
+    Hsys::ErrorStatus bdfOutOwnFields(HsDbBdfFiler* filer) const;
     // Runs the operation on each entry; the first status that is not eSuccess.
     template <class Operation> Hsys::ErrorStatus forEachEntry(Operation operation) const;
     Hsys::ErrorStatus readTdfEntry(HsDbTdfFiler* filer, ZyrImpObj*& entry);

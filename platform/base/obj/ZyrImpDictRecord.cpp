@@ -1,7 +1,6 @@
 #include "platform/base/obj/ZyrImpDictRecord.h"
 
-#include "platform/base/obj/ZyrConvertLegacyExtendData.h"
-#include "platform/base/obj/ZyrRegisterRelgraph.h"
+#include "platform/base/obj/ZyrLevelFiling.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
 #include "platform/host/rx/HsRxClass.h"
 
@@ -26,12 +25,12 @@ Hsys::ErrorStatus ZyrImpDictRecord::copyFrom(const HsRxObject* other) {
 }
 
 Hsys::ErrorStatus ZyrImpDictRecord::bdfInFields(HsDbBdfFiler* filer) {
-    ZyrRegisterRelgraph relgraph(filer, this, ZyrImpDictRecord::desc());
-    ZyrConvertLegacyExtendData legacy(filer, this, ZyrImpDictRecord::desc());
-    if (const Hsys::ErrorStatus status = ZyrImpObj::bdfInFields(filer); status != Hsys::eSuccess)
-        return status;
-    if (const Hsys::ErrorStatus status = bdfInVersion(filer); status != Hsys::eSuccess)
-        return status;
+    return Zyr::bdfInLevel(
+        filer, this, ZyrImpDictRecord::desc(), [&] { return ZyrImpObj::bdfInFields(filer); },
+        [&] { return bdfInVersion(filer); }, [&] { return bdfInOwnFields(filer); });
+}
+
+Hsys::ErrorStatus ZyrImpDictRecord::bdfInOwnFields(HsDbBdfFiler* filer) {
     ZyrRmCString name;
     ZyrRmCString description;
     Zyr::bdfReadItem(filer, name);
@@ -44,9 +43,12 @@ Hsys::ErrorStatus ZyrImpDictRecord::bdfInFields(HsDbBdfFiler* filer) {
 }
 
 Hsys::ErrorStatus ZyrImpDictRecord::bdfOutFields(HsDbBdfFiler* filer) const {
-    if (const Hsys::ErrorStatus status = ZyrImpObj::bdfOutFields(filer); status != Hsys::eSuccess)
-        return status;
-    bdfOutVersion(filer);
+    return Zyr::bdfOutLevel(
+        filer, [&] { return ZyrImpObj::bdfOutFields(filer); }, [&] { return bdfOutVersion(filer); },
+        [&] { return bdfOutOwnFields(filer); });
+}
+
+Hsys::ErrorStatus ZyrImpDictRecord::bdfOutOwnFields(HsDbBdfFiler* filer) const {
     Zyr::bdfWriteItem(filer, m_name);
     Zyr::bdfWriteItem(filer, m_description);
     return filer->filerStatus();

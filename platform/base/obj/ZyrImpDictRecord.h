@@ -29,6 +29,9 @@ public:
     Hsys::ErrorStatus setDescription(const ZyrRmCString& description);
 
 private:
+    // This level's own fields, after its base's and its version word.
+    Hsys::ErrorStatus bdfInOwnFields(HsDbBdfFiler* filer);
+    Hsys::ErrorStatus bdfOutOwnFields(HsDbBdfFiler* filer) const;
     Hsys::ErrorStatus setText(ZyrRmCString& field, const ZyrRmCString& text);
 
     ZyrRmCString m_name;

@@ -1,8 +1,7 @@
 #include "platform/base/obj/ZyrImpEnt.h"
 
-#include "platform/base/obj/ZyrConvertLegacyExtendData.h"
 #include "platform/base/obj/ZyrExtentsOptions.h"
-#include "platform/base/obj/ZyrRegisterRelgraph.h"
+#include "platform/base/obj/ZyrLevelFiling.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
 #include "platform/host/ge/HsGeBoundBlock3d.h"
 #include "platform/host/rx/HsRxClass.h"
@@ -32,19 +31,15 @@ ZyrImpEnt::ZyrImpEnt() = default;
 ZyrImpEnt::~ZyrImpEnt() = default;
 
 Hsys::ErrorStatus ZyrImpEnt::bdfInFields(HsDbBdfFiler* filer) {
-    ZyrRegisterRelgraph relgraph(filer, this, ZyrImpEnt::desc());
-    ZyrConvertLegacyExtendData legacy(filer, this, ZyrImpEnt::desc());
-    if (const Hsys::ErrorStatus status = ZyrImpObj::bdfInFields(filer); status != Hsys::eSuccess)
-        return status;
-    if (const Hsys::ErrorStatus status = bdfInVersion(filer); status != Hsys::eSuccess)
-        return status;
-    return filer->filerStatus();
+    return Zyr::bdfInLevel(
+        filer, this, ZyrImpEnt::desc(), [&] { return ZyrImpObj::bdfInFields(filer); },
+        [&] { return bdfInVersion(filer); }, Zyr::noOwnFields);
 }
 
 Hsys::ErrorStatus ZyrImpEnt::bdfOutFields(HsDbBdfFiler* filer) const {
-    if (const Hsys::ErrorStatus status = ZyrImpObj::bdfOutFields(filer); status != Hsys::eSuccess)
-        return status;
-    return bdfOutVersion(filer);
+    return Zyr::bdfOutLevel(
+        filer, [&] { return ZyrImpObj::bdfOutFields(filer); }, [&] { return bdfOutVersion(filer); },
+        Zyr::noOwnFields);
 }
 
 HsDbObjectId ZyrImpEnt::styleId() const {

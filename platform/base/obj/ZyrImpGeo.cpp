@@ -1,8 +1,7 @@
 #include "platform/base/obj/ZyrImpGeo.h"
 
-#include "platform/base/obj/ZyrConvertLegacyExtendData.h"
 #include "platform/base/obj/ZyrExtentsOptions.h"
-#include "platform/base/obj/ZyrRegisterRelgraph.h"
+#include "platform/base/obj/ZyrLevelFiling.h"
 #include "platform/base/obj/ZyrScaleInfo.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
 #include "platform/host/ge/HsGeBoundBlock3d.h"
@@ -49,12 +48,12 @@ Hsys::ErrorStatus ZyrImpGeo::copyFrom(const HsRxObject* other) {
 }
 
 Hsys::ErrorStatus ZyrImpGeo::bdfInFields(HsDbBdfFiler* filer) {
-    ZyrRegisterRelgraph relgraph(filer, this, ZyrImpGeo::desc());
-    ZyrConvertLegacyExtendData legacy(filer, this, ZyrImpGeo::desc());
-    if (const Hsys::ErrorStatus status = ZyrImpEnt::bdfInFields(filer); status != Hsys::eSuccess)
-        return status;
-    if (const Hsys::ErrorStatus status = bdfInVersion(filer); status != Hsys::eSuccess)
-        return status;
+    return Zyr::bdfInLevel(
+        filer, this, ZyrImpGeo::desc(), [&] { return ZyrImpEnt::bdfInFields(filer); },
+        [&] { return bdfInVersion(filer); }, [&] { return bdfInOwnFields(filer); });
+}
+
+Hsys::ErrorStatus ZyrImpGeo::bdfInOwnFields(HsDbBdfFiler* filer) {
     HsGeMatrix3d ecs;
     for (int row = 0; row < kMatrixSize; ++row)
         for (int column = 0; column < kMatrixSize; ++column)
@@ -70,9 +69,12 @@ Hsys::ErrorStatus ZyrImpGeo::bdfInFields(HsDbBdfFiler* filer) {
 }
 
 Hsys::ErrorStatus ZyrImpGeo::bdfOutFields(HsDbBdfFiler* filer) const {
-    if (const Hsys::ErrorStatus status = ZyrImpEnt::bdfOutFields(filer); status != Hsys::eSuccess)
-        return status;
-    bdfOutVersion(filer);
+    return Zyr::bdfOutLevel(
+        filer, [&] { return ZyrImpEnt::bdfOutFields(filer); }, [&] { return bdfOutVersion(filer); },
+        [&] { return bdfOutOwnFields(filer); });
+}
+
+Hsys::ErrorStatus ZyrImpGeo::bdfOutOwnFields(HsDbBdfFiler* filer) const {
     for (int row = 0; row < kMatrixSize; ++row)
         for (int column = 0; column < kMatrixSize; ++column)
             filer->writeDouble(m_ecs(row, column));

@@ -52,5 +52,8 @@ public:
     Hsys::ErrorStatus setEcs(const HsGeMatrix3d& ecs, bool validate = true);
 
 private:
+    // This level's own fields, after its base's and its version word.
+    Hsys::ErrorStatus bdfInOwnFields(HsDbBdfFiler* filer);
+    Hsys::ErrorStatus bdfOutOwnFields(HsDbBdfFiler* filer) const;
     HsGeMatrix3d m_ecs;
 };

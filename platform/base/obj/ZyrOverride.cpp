@@ -1,8 +1,7 @@
 #include "platform/base/obj/ZyrOverride.h"
 
-#include "platform/base/obj/ZyrConvertLegacyExtendData.h"
+#include "platform/base/obj/ZyrLevelFiling.h"
 #include "platform/base/obj/ZyrParamInfo.h"
-#include "platform/base/obj/ZyrRegisterRelgraph.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
 #include "platform/host/rx/HsRxClass.h"
 
@@ -13,19 +12,15 @@ ZyrOverride::ZyrOverride() = default;
 ZyrOverride::~ZyrOverride() = default;
 
 Hsys::ErrorStatus ZyrOverride::bdfInFields(HsDbBdfFiler* filer) {
-    ZyrRegisterRelgraph relgraph(filer, this, ZyrOverride::desc());
-    ZyrConvertLegacyExtendData legacy(filer, this, ZyrOverride::desc());
-    if (const Hsys::ErrorStatus status = ZyrImpObj::bdfInFields(filer); status != Hsys::eSuccess)
-        return status;
-    if (const Hsys::ErrorStatus status = bdfInVersion(filer); status != Hsys::eSuccess)
-        return status;
-    return filer->filerStatus();
+    return Zyr::bdfInLevel(
+        filer, this, ZyrOverride::desc(), [&] { return ZyrImpObj::bdfInFields(filer); },
+        [&] { return bdfInVersion(filer); }, Zyr::noOwnFields);
 }
 
 Hsys::ErrorStatus ZyrOverride::bdfOutFields(HsDbBdfFiler* filer) const {
-    if (const Hsys::ErrorStatus status = ZyrImpObj::bdfOutFields(filer); status != Hsys::eSuccess)
-        return status;
-    return bdfOutVersion(filer);
+    return Zyr::bdfOutLevel(
+        filer, [&] { return ZyrImpObj::bdfOutFields(filer); }, [&] { return bdfOutVersion(filer); },
+        Zyr::noOwnFields);
 }
 
 ZyrParamInfo* ZyrOverride::getParamInfo(int paramId, HsRxClass* paramClass,
