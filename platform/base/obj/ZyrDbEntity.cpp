@@ -1,10 +1,9 @@
 #include "platform/base/obj/ZyrDbEntity.h"
 
 #include "platform/base/obj/ZyrClassId.h"
-#include "platform/base/obj/ZyrConvertLegacyExtendData.h"
 #include "platform/base/obj/ZyrImpEnt.h"
+#include "platform/base/obj/ZyrLevelFiling.h"
 #include "platform/base/obj/ZyrOverride.h"
-#include "platform/base/obj/ZyrRegisterRelgraph.h"
 #include "platform/base/res/ZyrRmCString.h"
 #include "platform/base/zyrtl/zyrtlDelete.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
@@ -82,24 +81,16 @@ Hsys::ErrorStatus ZyrDbEntity::audit(HsDbAuditInfo* info) {
 }
 
 Hsys::ErrorStatus ZyrDbEntity::bdfInFields(HsDbBdfFiler* filer) {
-    ZyrRegisterRelgraph relgraph(filer, this, ZyrDbEntity::desc());
-    ZyrConvertLegacyExtendData legacy(filer, this, ZyrDbEntity::desc());
-    if (const Hsys::ErrorStatus status = HsDbEntity::bdfInFields(filer); status != Hsys::eSuccess)
-        return status;
-    if (const Hsys::ErrorStatus status = bdfInVersionAndImp(filer, ZyrImpEnt::desc());
-        status != Hsys::eSuccess)
-        return status;
-    if (const Hsys::ErrorStatus status = bdfInOverrides(filer); status != Hsys::eSuccess)
-        return status;
-    return filer->filerStatus();
+    return Zyr::bdfInLevel(
+        filer, this, ZyrDbEntity::desc(), [&] { return HsDbEntity::bdfInFields(filer); },
+        [&] { return bdfInVersionAndImp(filer, ZyrImpEnt::desc()); },
+        [&] { return bdfInOverrides(filer); });
 }
 
 Hsys::ErrorStatus ZyrDbEntity::bdfOutFields(HsDbBdfFiler* filer) const {
-    if (const Hsys::ErrorStatus status = HsDbEntity::bdfOutFields(filer); status != Hsys::eSuccess)
-        return status;
-    if (const Hsys::ErrorStatus status = bdfOutVersionAndImp(filer); status != Hsys::eSuccess)
-        return status;
-    return bdfOutOverrides(filer);
+    return Zyr::bdfOutLevel(
+        filer, [&] { return HsDbEntity::bdfOutFields(filer); },
+        [&] { return bdfOutVersionAndImp(filer); }, [&] { return bdfOutOverrides(filer); });
 }
 
 Hsys::ErrorStatus ZyrDbEntity::bdfOutOverrides(HsDbBdfFiler* filer) const {

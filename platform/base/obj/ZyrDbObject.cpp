@@ -1,9 +1,8 @@
 #include "platform/base/obj/ZyrDbObject.h"
 
 #include "platform/base/obj/ZyrClassId.h"
-#include "platform/base/obj/ZyrConvertLegacyExtendData.h"
 #include "platform/base/obj/ZyrImpObj.h"
-#include "platform/base/obj/ZyrRegisterRelgraph.h"
+#include "platform/base/obj/ZyrLevelFiling.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
 #include "platform/host/rx/HsRxClass.h"
 
@@ -42,20 +41,15 @@ Hsys::ErrorStatus ZyrDbObject::audit(HsDbAuditInfo* info) {
 }
 
 Hsys::ErrorStatus ZyrDbObject::bdfInFields(HsDbBdfFiler* filer) {
-    ZyrRegisterRelgraph relgraph(filer, this, ZyrDbObject::desc());
-    ZyrConvertLegacyExtendData legacy(filer, this, ZyrDbObject::desc());
-    if (const Hsys::ErrorStatus status = HsDbObject::bdfInFields(filer); status != Hsys::eSuccess)
-        return status;
-    if (const Hsys::ErrorStatus status = bdfInVersionAndImp(filer, ZyrImpObj::desc());
-        status != Hsys::eSuccess)
-        return status;
-    return filer->filerStatus();
+    return Zyr::bdfInLevel(
+        filer, this, ZyrDbObject::desc(), [&] { return HsDbObject::bdfInFields(filer); },
+        [&] { return bdfInVersionAndImp(filer, ZyrImpObj::desc()); }, Zyr::noOwnFields);
 }
 
 Hsys::ErrorStatus ZyrDbObject::bdfOutFields(HsDbBdfFiler* filer) const {
-    if (const Hsys::ErrorStatus status = HsDbObject::bdfOutFields(filer); status != Hsys::eSuccess)
-        return status;
-    return bdfOutVersionAndImp(filer);
+    return Zyr::bdfOutLevel(
+        filer, [&] { return HsDbObject::bdfOutFields(filer); },
+        [&] { return bdfOutVersionAndImp(filer); }, Zyr::noOwnFields);
 }
 
 Hsys::ErrorStatus ZyrDbObject::tdfInFields(HsDbTdfFiler* filer) {

@@ -1,11 +1,10 @@
 #include "platform/base/obj/ZyrImpObj.h"
 
-#include "platform/base/obj/ZyrConvertLegacyExtendData.h"
 #include "platform/base/obj/ZyrDbImpOwner.h"
 #include "platform/base/obj/ZyrEnhancedReferenceAuditInfo.h"
+#include "platform/base/obj/ZyrLevelFiling.h"
 #include "platform/base/obj/ZyrParamContainer.h"
 #include "platform/base/obj/ZyrParamInfo.h"
-#include "platform/base/obj/ZyrRegisterRelgraph.h"
 #include "platform/base/relgraph/ZyrObjReferenceInfo.h"
 #include "platform/base/relgraph/ZyrObjReferenceMap.h"
 #include "platform/base/relgraph/ZyrObjRelGraph.h"
@@ -56,11 +55,10 @@ std::int16_t ZyrImpObj::ZyrCurrentVersion() const {
 }
 
 Hsys::ErrorStatus ZyrImpObj::bdfInFields(HsDbBdfFiler* filer) {
-    ZyrRegisterRelgraph relgraph(filer, this, ZyrImpObj::desc());
-    ZyrConvertLegacyExtendData legacy(filer, this, ZyrImpObj::desc());
-    if (const Hsys::ErrorStatus status = bdfInVersion(filer); status != Hsys::eSuccess)
-        return status;
-    return filer->filerStatus();
+    // The root level has no base to read first.
+    return Zyr::bdfInLevel(
+        filer, this, ZyrImpObj::desc(), Zyr::noOwnFields, [&] { return bdfInVersion(filer); },
+        Zyr::noOwnFields);
 }
 
 Hsys::ErrorStatus ZyrImpObj::bdfOutFields(HsDbBdfFiler* filer) const {
