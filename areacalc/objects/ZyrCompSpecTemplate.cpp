@@ -2,6 +2,8 @@
 
 #include "areacalc/module/ZyrAreaCalculationClassRegistration.h"
 #include "areacalc/objects/ZyrDbArea.h"
+#include "areacalc/objects/ZyrDbAreaGroup.h"
+#include "areacalc/objects/ZyrDbAreaGroupStyle.h"
 #include "areacalc/objects/ZyrDbAreaStyle.h"
 
 template <class Object, class Style>
@@ -24,3 +26,19 @@ ZyrRxClassDecorator gZyrDecoratorZyrCompSpecArea(typeid(ZyrCompSpecArea), typeid
                                                  &ZyrCompSpecArea::rxInit, &ZyrCompSpecArea::desc,
                                                  &_hdllInstance, ZyrRxClassDecorator::kNoText,
                                                  ZyrRxClassDecorator::kNoText);
+
+HsRxObject* makeZyrCompSpecAreaGroup() {
+    return new ZyrCompSpecAreaGroup();
+}
+
+template <> const wchar_t* const ZyrCompSpecAreaGroup::kClassName = L"ZyrCompSpecAreaGroup";
+template <>
+const HsRxClass::PseudoConstructor ZyrCompSpecAreaGroup::kFactory = makeZyrCompSpecAreaGroup;
+template class ZyrCompSpecTemplate<ZyrDbAreaGroup, ZyrDbAreaGroupStyle>;
+
+ZyrRxClassDecorator gZyrDecoratorZyrCompSpecAreaGroup(typeid(ZyrCompSpecAreaGroup),
+                                                      typeid(ZyrCompSpec),
+                                                      &ZyrCompSpecAreaGroup::rxInit,
+                                                      &ZyrCompSpecAreaGroup::desc, &_hdllInstance,
+                                                      ZyrRxClassDecorator::kNoText,
+                                                      ZyrRxClassDecorator::kNoText);

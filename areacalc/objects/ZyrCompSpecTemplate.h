@@ -47,3 +47,14 @@ extern template class ZyrCompSpecTemplate<ZyrDbArea, ZyrDbAreaStyle>;
 
 // A new component description of areas, owned by the caller.
 HsRxObject* makeZyrCompSpecArea();
+
+class ZyrDbAreaGroup;
+class ZyrDbAreaGroupStyle;
+
+using ZyrCompSpecAreaGroup = ZyrCompSpecTemplate<ZyrDbAreaGroup, ZyrDbAreaGroupStyle>;
+template <> const wchar_t* const ZyrCompSpecAreaGroup::kClassName;
+template <> const HsRxClass::PseudoConstructor ZyrCompSpecAreaGroup::kFactory;
+extern template class ZyrCompSpecTemplate<ZyrDbAreaGroup, ZyrDbAreaGroupStyle>;
+
+// A new component description of area groups, owned by the caller.
+HsRxObject* makeZyrCompSpecAreaGroup();

@@ -1,14 +1,17 @@
 #include "areacalc/objects/ZyrDbArea.h"
 
 #include "areacalc/module/ZyrAreaCalculationBaseApp.h"
+#include "areacalc/objects/ZyrDbAreaGroup.h"
 #include "areacalc/objects/ZyrDbAreaStyle.h"
 #include "areacalc/objects/ZyrDictAreaStyle.h"
+#include "platform/base/app/ZyrBaseServices.h"
 #include "platform/base/app/ZyrHdxEquipment.h"
 #include "platform/base/obj/ZyrExtentsOptions.h"
 #include "platform/base/obj/ZyrScaleInfo.h"
 #include "platform/base/obj/ZyrTol.h"
 #include "platform/base/relgraph/ZyrAuditUtilities.h"
 #include "platform/base/relgraph/ZyrObjReferenceMap.h"
+#include "platform/base/relgraph/ZyrObjRelGraph.h"
 #include "platform/base/summary/ZyrDesc.h"
 #include "platform/base/summary/ZyrDisplayFormat.h"
 #include "platform/host/db/HsDbAuditInfo.h"
@@ -286,6 +289,40 @@ double ZyrImpArea::perimeter() const {
 }
 
 // ---- ZyrDbArea ----
+
+namespace {
+
+// Takes the area out of every group that refers to it; what cannot be opened or upgraded stays.
+void leaveGroups(const ZyrDbArea& area) {
+    ZyrBaseServices* services = ZyrBaseServices::service();
+    ZyrObjRelGraph* graph = services != nullptr ? services->objRelGraph(area.database()) : nullptr;
+    if (graph == nullptr)
+        return;
+    HsArray<HsDbObjectId> referrers;
+    HsArray<int> types;
+    static_cast<void>(graph->getReferencesToMe(&area, referrers, types, true));
+    for (int i = 0; i < referrers.length(); ++i) {
+        ZyrDbAreaGroup* group = nullptr;
+        if (ZyrDbAreaGroup::open(group, referrers[i], HsDb::kForRead) != Hsys::eSuccess)
+            continue;
+        if (group->upgradeOpen() == Hsys::eSuccess) {
+            static_cast<void>(group->groupHandler()->removeLeaf(area.objectId()));
+            static_cast<void>(group->downgradeOpen());
+        }
+        group->close();
+    }
+}
+
+} // namespace
+
+Hsys::ErrorStatus ZyrDbArea::subHandOverTo(HsDbObject* newObject) {
+    const Hsys::ErrorStatus status = ZyrDbGeo::subHandOverTo(newObject);
+    if (status != Hsys::eSuccess)
+        return status;
+    if (newObject == nullptr || newObject->isA() != ZyrDbArea::desc())
+        leaveGroups(*this);
+    return status;
+}
 
 void ZyrDbArea::getLayerKey(ZyrRmCString& key) const {
     key = kLayerKey;

@@ -102,6 +102,10 @@ public:
 
     using ZyrDbPair::ZyrDbPair;
 
+    // The base's refusal is returned as it is. An object of another class than ZyrDbArea taking
+    // the area's place is no area to the groups: every group that holds the area lets it go.
+    // Groups that cannot be opened or upgraded keep it. The base's status.
+    Hsys::ErrorStatus subHandOverTo(HsDbObject* newObject) override;
     void getLayerKey(ZyrRmCString& key) const override;
     bool isModelGeometry() const override { return true; }
 

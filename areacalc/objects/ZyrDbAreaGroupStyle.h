@@ -7,6 +7,8 @@
 #include "platform/base/obj/ZyrDbDictRecord.h"
 #include "platform/base/obj/ZyrImpDictRecord.h"
 
+class ZyrDbAreaGroup;
+
 // A style is its name and what ZyrImpDictRecord holds; it adds no field of its own. Binary
 // filing after ZyrImpDictRecord's: int16 80 alone.
 class ZyrImpAreaGroupStyle : public ZyrImpPair<ZyrImpAreaGroupStyle, ZyrImpDictRecord> {
@@ -21,6 +23,10 @@ public:
     static constexpr const wchar_t* kClassIdWord = L"ZyrAreaGroupStyle";
 
     using ZyrDbPair::ZyrDbPair;
+
+    // The sample group of the style's previews (ZyrAreaGroupDbOperations::sample) with this style:
+    // new, in no database, owned by the caller. Null when it cannot be made.
+    ZyrDbAreaGroup* getSample() const;
 
     ZyrImpAreaGroupStyle* areaGroupStyleImp() { return pairImp(); }
     const ZyrImpAreaGroupStyle* areaGroupStyleImp() const { return pairImp(); }

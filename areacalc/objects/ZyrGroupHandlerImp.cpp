@@ -150,6 +150,13 @@ Hsys::ErrorStatus ZyrGroupHandlerImp::copyFrom(const ZyrGroupHandlerImp& other) 
     return Hsys::eSuccess;
 }
 
+void ZyrGroupHandlerImp::replaceLists(IdList nodes, IdList leafs) {
+    assertParentWriteEnabled();
+    m_nodes = std::move(nodes);
+    m_leafs = std::move(leafs);
+    recordParentReferencesModified();
+}
+
 Hsys::ErrorStatus ZyrGroupHandlerImp::getReferencedObjects(ZyrObjReferenceMap& map) const {
     constexpr int kMember = ZyrObjReferenceInfo::kMemberRelation;
     const int leafExportClone = map.context() == ZyrObjReferenceMap::kSelectionCopyContext ? 1 : 0;

@@ -84,6 +84,9 @@ public:
 
     // Lists and mode of a handler for the same classes; eDoesNotApply for other classes.
     Hsys::ErrorStatus copyFrom(const ZyrGroupHandlerImp& other);
+    // Both lists as an old stream of the group gave them, without the checks of the adds; the mode
+    // stays. Asserts write and tells the relationship graph, as every change of a list does.
+    void replaceLists(IdList nodes, IdList leafs);
     // Leafs, then nodes, as member relations. A copy takes the child groups along in both roles; an
     // export takes the areas along only in a selection copy's context.
     Hsys::ErrorStatus getReferencedObjects(ZyrObjReferenceMap& map) const;

@@ -5,6 +5,7 @@
 #include "areacalc/module/ZyrAreaCalculationBaseApp.h"
 #include "areacalc/module/ZyrAreaCalculationBaseModule.h"
 #include "areacalc/objects/ZyrDbArea.h"
+#include "areacalc/objects/ZyrDbAreaGroup.h"
 #include "areacalc/objects/ZyrDbAreaGroupStyle.h"
 #include "areacalc/objects/ZyrDbAreaStyle.h"
 #include "areacalc/objects/ZyrDictAreaGroupStyle.h"
@@ -77,6 +78,26 @@ protected:
             EXPECT_EQ(area->setStyleId(style), Hsys::eSuccess);
         }
         return add(area);
+    }
+
+    // A group of the drawing holding the given groups and then the given areas, each added through
+    // its handler in this order.
+    HsDbObjectId addGroup(const wchar_t* name, std::initializer_list<HsDbObjectId> groups = {},
+                          std::initializer_list<HsDbObjectId> areas = {}) {
+        auto* group = new ZyrDbAreaGroup;
+        EXPECT_EQ(group->setName(name), Hsys::eSuccess);
+        const HsDbObjectId id = add(group);
+        HsDbObjectPointer<ZyrDbAreaGroup> opened(id, HsDb::kForWrite);
+        for (const HsDbObjectId& child : groups) {
+            EXPECT_EQ(opened->groupHandler()->addNode(child), Hsys::eSuccess);
+        }
+        for (const HsDbObjectId& area : areas) {
+            EXPECT_EQ(opened->groupHandler()->addLeaf(area), Hsys::eSuccess);
+        }
+        return id;
+    }
+    static void erase(const HsDbObjectId& id) {
+        EXPECT_EQ(HsDbObjectPointer<HsDbObject>(id, HsDb::kForWrite)->erase(), Hsys::eSuccess);
     }
 
     HsDbDatabase database;

@@ -1,0 +1,121 @@
+// Walks over a tree of area groups: the forward and backward orders, reset, forEach, and groups
+// that are erased or cannot be opened.
+#include "tests/areacalc/ZyrAreaDrawing.h"
+
+#include "areacalc/objects/ZyrDbAreaGroupConstIterator.h"
+#include "platform/host/ut/HsAssertionViolation.h"
+
+namespace {
+
+using Names = std::vector<std::wstring>;
+using Ids = std::vector<HsDbObjectId>;
+
+// root holds K and L; K holds M.
+class ZyrAreaGroupWalks : public ZyrAreaDrawing {
+protected:
+    void SetUp() override {
+        ZyrAreaDrawing::SetUp();
+        M = addGroup(L"M");
+        K = addGroup(L"K", {M});
+        L = addGroup(L"L");
+        root = addGroup(L"root", {K, L});
+    }
+
+    // What a walk hands out until done, a null as "-". A null from an erased group was passed
+    // over already, so the walk goes on without a step; a second null in a row is a group that
+    // cannot be opened, where a caller must break off.
+    template <class Iterator> static Names walk(Iterator& it) {
+        Names seen;
+        bool afterNull = false;
+        while (!it.done()) {
+            const ZyrDbAreaGroup* group = *it;
+            if (group == nullptr && afterNull)
+                break;
+            afterNull = group == nullptr;
+            seen.push_back(group != nullptr ? group->name().str() : L"-");
+            if (group != nullptr)
+                ++it;
+        }
+        return seen;
+    }
+    template <class Iterator> static Names walkFrom(const HsDbObjectId& id) {
+        Iterator it(id);
+        return walk(it);
+    }
+
+    HsDbObjectId M, K, L, root;
+};
+
+TEST_F(ZyrAreaGroupWalks, forwardGoesParentsFirstAndBackwardTheExactReverse) {
+    EXPECT_EQ(walkFrom<ZyrDbAreaGroupConstForwardIterator>(root),
+              (Names{L"root", L"K", L"M", L"L"}));
+    EXPECT_EQ(walkFrom<ZyrDbAreaGroupConstBackwardIterator>(root),
+              (Names{L"L", L"M", L"K", L"root"}));
+    EXPECT_EQ(walkFrom<ZyrDbAreaGroupConstForwardIterator>(M), Names{L"M"});
+    EXPECT_EQ(walkFrom<ZyrDbAreaGroupConstBackwardIterator>(M), Names{L"M"});
+    Ids collected;
+    forEach<ZyrDbAreaGroupConstForwardIteratorImp>(root, ZyrAreaGroupCollectorVector(collected));
+    EXPECT_EQ(collected, (Ids{root, K, M, L}));
+}
+
+TEST_F(ZyrAreaGroupWalks, resetReadsTheTreeAgainForwardButNotBackward) {
+    ZyrDbAreaGroupConstForwardIterator forward(root);
+    ZyrDbAreaGroupConstBackwardIterator backward(root);
+    EXPECT_EQ(walk(forward).size(), 4u);
+    EXPECT_EQ(walk(backward).size(), 4u);
+    const HsDbObjectId N = addGroup(L"N");
+    ASSERT_EQ(HsDbObjectPointer<ZyrDbAreaGroup>(L, HsDb::kForWrite)->groupHandler()->addNode(N),
+              Hsys::eSuccess);
+    forward.reset();
+    backward.reset();
+    EXPECT_EQ(walk(forward), (Names{L"root", L"K", L"M", L"L", L"N"}));
+    EXPECT_EQ(walk(backward), (Names{L"L", L"M", L"K", L"root"}));
+}
+
+TEST_F(ZyrAreaGroupWalks, anErasedGroupIsSeenOnceAsNullAndNotDescendedInto) {
+    erase(K);
+    EXPECT_EQ(walkFrom<ZyrDbAreaGroupConstForwardIterator>(root), (Names{L"root", L"-", L"L"}));
+    Ids collected;
+    EXPECT_THROW(forEach<ZyrDbAreaGroupConstForwardIteratorImp>(
+                     root, ZyrAreaGroupCollectorVector(collected)),
+                 HsAssertionViolation)
+        << "its callers give it trees without erased groups";
+    EXPECT_EQ(collected, Ids{root});
+    EXPECT_THROW(ZyrDbAreaGroupConstBackwardIterator{root}, HsAssertionViolation);
+}
+
+TEST_F(ZyrAreaGroupWalks, aGroupThatCannotBeOpenedStopsTheWalkWhereItIs) {
+    HsDbObjectPointer<ZyrDbAreaGroup> held(K, HsDb::kForWrite);
+    ZyrDbAreaGroupConstForwardIterator it(root);
+    EXPECT_EQ(walk(it), (Names{L"root", L"-"}));
+    EXPECT_FALSE(it.done());
+    ++it;
+    EXPECT_EQ(*it, nullptr) << "the step did nothing";
+    held.close();
+    EXPECT_EQ(walk(it), (Names{L"K", L"M", L"L"}));
+}
+
+TEST_F(ZyrAreaGroupWalks, onlyTheGroupHandedOutIsOpenUntilTheNextStep) {
+    const auto writable = [](const HsDbObjectId& id) {
+        return HsDbObjectPointer<ZyrDbAreaGroup>(id, HsDb::kForWrite).openStatus() ==
+               Hsys::eSuccess;
+    };
+    {
+        ZyrDbAreaGroupConstForwardIterator forward(root);
+        ZyrDbAreaGroupConstBackwardIterator backward(root);
+        EXPECT_EQ(forward->name(), L"root");
+        EXPECT_EQ(backward->name(), L"L");
+        EXPECT_FALSE(writable(root));
+        EXPECT_FALSE(writable(L));
+        ++forward;
+        ++backward;
+        EXPECT_TRUE(writable(root));
+        EXPECT_TRUE(writable(L));
+        EXPECT_EQ((*forward)->name(), L"K");
+        EXPECT_EQ((*backward)->name(), L"M");
+    }
+    EXPECT_TRUE(writable(K)) << "closed by the iterators' end";
+    EXPECT_TRUE(writable(M));
+}
+
+} // namespace
