@@ -21,15 +21,17 @@ public:                                                                         
                    : nullptr;                                                                      \
     }
 
-// Defines them: the descriptor is registered on first use under the class's own name, after its
-// parent. CONSTRUCTOR is a pseudo constructor or nullptr for an abstract class.
+// Defines them: the descriptor is registered under the class's own name, after its parent, when
+// the library is loaded, so that a drawing read before any object of the class was made finds the
+// class by name. CONSTRUCTOR is a pseudo constructor or nullptr for an abstract class.
 #define HSRX_DEFINE_MEMBERS(CLASS, PARENT, PROXY_FLAGS, CONSTRUCTOR)                               \
     HsRxClass* CLASS::desc() {                                                                     \
         static HsRxClass* const descriptor =                                                       \
             hsrxRegisterOnce(L"" #CLASS, PARENT::desc(), PROXY_FLAGS, CONSTRUCTOR);                \
         return descriptor;                                                                         \
     }                                                                                              \
-    HsRxClass* CLASS::isA() const { return CLASS::desc(); }
+    HsRxClass* CLASS::isA() const { return CLASS::desc(); }                                        \
+    [[maybe_unused]] static HsRxClass* const gHsRxRegisteredAtLoad##CLASS = CLASS::desc();
 
 class HsRxObject {
 public:

@@ -6,6 +6,7 @@
 #include "platform/base/obj/ZyrImpGeo.h"
 #include "platform/host/db/HsDbDatabase.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
+#include "platform/host/rx/HsRxClass.h"
 #include "platform/host/ge/HsGeCircArc2d.h"
 #include "platform/host/ge/HsGeLineSeg2d.h"
 #include "platform/host/ge/HsGeMatrix3d.h"
@@ -21,6 +22,12 @@
 #include <utility>
 
 namespace {
+
+// Taken while the test program starts, before any test made a profile: a drawing read first thing
+// must find the class of the profiles nested in its areas by name.
+const bool gProfileClassKnownAtLoad = hsrxFindHsRxClass(L"ZyrGeProfile") != nullptr;
+
+TEST(ZyrGeProfile, isRegisteredWhenTheLibraryLoads) { EXPECT_TRUE(gProfileClassKnownAtLoad); }
 
 constexpr double kPi = std::numbers::pi;
 // A rectangle of 10 by 8 with a three-quarter circle of radius 4 on a corner, less a triangle
