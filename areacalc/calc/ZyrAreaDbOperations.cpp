@@ -1,9 +1,13 @@
 #include "areacalc/calc/ZyrAreaDbOperations.h"
 
+#include "areacalc/calc/ZyrAreaCalculationAreaAlgorithm.h"
+#include "areacalc/calc/ZyrAreaCalculationPerimeterAlgorithm.h"
+#include "areacalc/modifiers/ZyrDbAreaModifierOperations.h"
 #include "areacalc/objects/ZyrDbArea.h"
 #include "platform/base/app/ZyrEntityLayer.h"
 #include "platform/base/geom/ZyrGeProfile.h"
 #include "platform/host/db/HsDbHostApplicationServices.h"
+#include "platform/host/db/HsDbObjectPointer.h"
 #include "platform/host/ge/HsGeCircArc2d.h"
 #include "platform/host/ge/HsGeLineSeg2d.h"
 
@@ -11,6 +15,33 @@
 #include <new>
 
 namespace {
+
+using AreaValue = double (ZyrDbArea::*)() const;
+
+Hsys::ErrorStatus grossValue(ZyrDbArea* area, AreaValue read, double& value) {
+    if (area == nullptr)
+        return Hsys::eNullPointer;
+    value = (area->*read)();
+    return Hsys::eSuccess;
+}
+
+Hsys::ErrorStatus modifiedValue(ZyrDbArea* area, AreaValue read, HsRxClass* algorithm,
+                                double& value) {
+    value = (area->*read)();
+    return ZyrDbAreaModifierOperations::applyTo(area, algorithm, value);
+}
+
+// One value of the area behind an id, through the pointer form. The open's failure comes back as
+// it is; an open that succeeds without an object gives eNullPointer.
+template <class ValueOfArea>
+Hsys::ErrorStatus valueById(const HsDbObjectId& id, ValueOfArea valueOf) {
+    HsDbObjectPointer<ZyrDbArea> area(id, HsDb::kForRead);
+    if (area.openStatus() != Hsys::eSuccess)
+        return area.openStatus();
+    if (!area)
+        return Hsys::eNullPointer;
+    return valueOf(area.object());
+}
 
 // A ring of straight segments through the corners in order, back to the first.
 void addLines(ZyrGeRing& ring, std::initializer_list<HsGePoint2d> corners) {
@@ -59,4 +90,37 @@ ZyrDbArea* ZyrAreaDbOperations::sample(HsDbDatabase* database) {
     static_cast<void>(profile->addRing(sampleHole().release()));
     area->setProfile(profile.release());
     return area.release();
+}
+
+Hsys::ErrorStatus ZyrAreaDbOperations::area(ZyrDbArea* area, double& value) {
+    return grossValue(area, &ZyrDbArea::area, value);
+}
+
+Hsys::ErrorStatus ZyrAreaDbOperations::perimeter(ZyrDbArea* area, double& value) {
+    return grossValue(area, &ZyrDbArea::perimeter, value);
+}
+
+Hsys::ErrorStatus ZyrAreaDbOperations::areaModified(ZyrDbArea* area, double& value) {
+    return modifiedValue(area, &ZyrDbArea::area, ZyrAreaCalculationAreaAlgorithm::desc(), value);
+}
+
+Hsys::ErrorStatus ZyrAreaDbOperations::perimeterModified(ZyrDbArea* area, double& value) {
+    return modifiedValue(area, &ZyrDbArea::perimeter, ZyrAreaCalculationPerimeterAlgorithm::desc(),
+                         value);
+}
+
+Hsys::ErrorStatus ZyrAreaDbOperations::area(const HsDbObjectId& id, double& value) {
+    return valueById(id, [&](ZyrDbArea* area) { return ZyrAreaDbOperations::area(area, value); });
+}
+
+Hsys::ErrorStatus ZyrAreaDbOperations::perimeter(const HsDbObjectId& id, double& value) {
+    return valueById(id, [&](ZyrDbArea* area) { return ZyrAreaDbOperations::perimeter(area, value); });
+}
+
+Hsys::ErrorStatus ZyrAreaDbOperations::areaModified(const HsDbObjectId& id, double& value) {
+    return valueById(id, [&](ZyrDbArea* area) { return areaModified(area, value); });
+}
+
+Hsys::ErrorStatus ZyrAreaDbOperations::perimeterModified(const HsDbObjectId& id, double& value) {
+    return valueById(id, [&](ZyrDbArea* area) { return perimeterModified(area, value); });
 }
