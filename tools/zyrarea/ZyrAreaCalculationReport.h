@@ -20,9 +20,13 @@ public:
     static std::vector<HsDbObjectId> rootsOf(const HsDbDatabase& database);
     // The result rows, one per node in tree order: the name indented by two spaces per level,
     // then gross and net of each attached algorithm, in the drawing's display units ("" where a
-    // group did not allow the algorithm). The first row holds the column titles.
+    // group did not allow the algorithm). The first row holds the column titles. Under a node's
+    // row, one row of a single cell per step a value of it took through a modifier: indented one
+    // level deeper, the modifier's name, its formula with the parameters written in, the
+    // algorithm and the value before and after the step.
     static std::vector<std::vector<std::wstring>> rows(HsDbDatabase& database,
                                                        const ZyrAreaCalculationStream& stream);
-    // The rows in aligned columns on the host's console.
+    // The rows in aligned columns on the host's console. A row of a single cell is a line of its
+    // own: it does not widen the first column.
     static void print(const std::vector<std::vector<std::wstring>>& rows);
 };

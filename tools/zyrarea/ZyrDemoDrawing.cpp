@@ -21,29 +21,50 @@ namespace {
 
 using Ids = std::vector<HsDbObjectId>;
 
-enum Floor { kGroundFloor, kUpperFloor };
+enum Floor { kGroundFloor, kUpperFloor, kAttic, kFloorCount };
 
-// A room of the plan: its name, its rectangle's sides in metres, its floor, and whether its area
-// counts only half, as that of a balcony does.
+// How much of a room's area counts: in full, or through one of the drawing's modifier records.
+enum Counting { kSlopingRoof, kBalconyShare, kCountingModifiers, kInFull = kCountingModifiers };
+
+// A modifier record of the plan. Both act on the area alone: perimeters are measured in full.
+struct Modifier {
+    const wchar_t* name;
+    const wchar_t* formula;
+    // Null for a formula without a named parameter.
+    const wchar_t* parameterName;
+    double parameterValue;
+};
+
+constexpr Modifier kModifiers[kCountingModifiers] = {
+    {L"Sloping roof", L"_AREA_VALUE_ * 0.5", nullptr, 0.0},
+    {L"Balcony share", L"_AREA_VALUE_ * share", L"share", 0.25},
+};
+
+// A room of the plan: its name, its rectangle's sides in metres, its floor, and how its area
+// counts.
 struct Room {
     const wchar_t* name;
     double width;
     double depth;
     Floor floor;
-    bool halfCounted;
+    Counting counting;
 };
 
-// Area and perimeter are width times depth and twice their sum: Kitchen 20 m² and 18 m.
+// Area and perimeter are width times depth and twice their sum: Kitchen 20 m² and 18 m. The attic
+// room lies under the sloping roof and counts half, 10 m²; a quarter of the balcony counts, 1.5 m².
 constexpr Room kRooms[] = {
-    {L"Kitchen", 4.0, 5.0, kGroundFloor, false}, {L"Living room", 6.0, 5.0, kGroundFloor, false},
-    {L"Hall", 2.0, 5.0, kGroundFloor, false},    {L"Bedroom", 4.0, 4.0, kUpperFloor, false},
-    {L"Bath", 2.5, 2.0, kUpperFloor, false},     {L"Balcony", 4.0, 1.5, kUpperFloor, true},
+    {L"Kitchen", 4.0, 5.0, kGroundFloor, kInFull},
+    {L"Living room", 6.0, 5.0, kGroundFloor, kInFull},
+    {L"Hall", 2.0, 5.0, kGroundFloor, kInFull},
+    {L"Bedroom", 4.0, 4.0, kUpperFloor, kInFull},
+    {L"Bath", 2.5, 2.0, kUpperFloor, kInFull},
+    {L"Balcony", 4.0, 1.5, kUpperFloor, kBalconyShare},
+    {L"Attic room", 4.0, 5.0, kAttic, kSlopingRoof},
 };
-constexpr const wchar_t* kFloorNames[] = {L"Ground floor", L"Upper floor"};
+constexpr const wchar_t* kFloorNames[kFloorCount] = {L"Ground floor", L"Upper floor", L"Attic"};
 constexpr const wchar_t* kHouseName = L"House";
 // The style preview's sample area stands beside the house: a room with a curved wall and a shaft.
 constexpr const wchar_t* kSampleName = L"Sample area";
-constexpr const wchar_t* kHalfModifierName = L"Half counted";
 
 ZyrGeProfile* rectangle(double width, double depth) {
     const HsGePoint2d corners[] = {{0, 0}, {width, 0}, {width, depth}, {0, depth}};
@@ -69,7 +90,7 @@ Hsys::ErrorStatus add(HsDbDatabase& database, std::unique_ptr<HsDbObject> object
 }
 
 Hsys::ErrorStatus addRoom(HsDbDatabase& database, const Room& room,
-                          const HsDbObjectId& halfModifier, HsDbObjectId& id) {
+                          const HsDbObjectId (&modifiers)[kCountingModifiers], HsDbObjectId& id) {
     auto area = std::make_unique<ZyrDbArea>();
     ZyrGeProfile* profile = rectangle(room.width, room.depth);
     if (profile == nullptr)
@@ -77,20 +98,20 @@ Hsys::ErrorStatus addRoom(HsDbDatabase& database, const Room& room,
     Hsys::ErrorStatus status = area->setProfile(profile);
     if (status == Hsys::eSuccess)
         status = area->setName(room.name);
-    if (status == Hsys::eSuccess && room.halfCounted)
-        status = ZyrDbAreaModifierOperations::appendModifier(area.get(), halfModifier);
+    if (status == Hsys::eSuccess && room.counting != kInFull)
+        status = ZyrDbAreaModifierOperations::appendModifier(area.get(), modifiers[room.counting]);
     return status == Hsys::eSuccess ? add(database, std::move(area), id) : status;
 }
 
-// Halves the area value; perimeters are measured in full.
-Hsys::ErrorStatus addHalfModifier(HsDbDatabase& database, HsDbObjectId& id) {
+Hsys::ErrorStatus addModifier(HsDbDatabase& database, const Modifier& data, HsDbObjectId& id) {
     auto modifier = std::make_unique<ZyrDbAreaModifier>();
-    Hsys::ErrorStatus status = modifier->setExpression(L"_AREA_VALUE_ * 0.5");
+    Hsys::ErrorStatus status = modifier->setExpression(data.formula);
+    if (status == Hsys::eSuccess && data.parameterName != nullptr)
+        status = modifier->addParameter(data.parameterName, data.parameterValue);
     if (status == Hsys::eSuccess)
         status = modifier->removeAlgorithm(ZyrAreaCalculationPerimeterAlgorithm::desc());
     if (status == Hsys::eSuccess)
-        status =
-            ZyrDictAreaModifiers(&database).addNewRecord(kHalfModifierName, modifier.get(), id);
+        status = ZyrDictAreaModifiers(&database).addNewRecord(data.name, modifier.get(), id);
     if (status != Hsys::eSuccess)
         return status;
     return modifier.release()->close();
@@ -136,20 +157,22 @@ Hsys::ErrorStatus prepare(HsDbDatabase& database) {
 }
 
 Hsys::ErrorStatus addHouse(HsDbDatabase& database) {
-    HsDbObjectId halfModifier;
-    if (const Hsys::ErrorStatus status = addHalfModifier(database, halfModifier);
-        status != Hsys::eSuccess)
-        return status;
-    Ids roomsOf[2];
+    HsDbObjectId modifiers[kCountingModifiers];
+    for (int counting = 0; counting < kCountingModifiers; ++counting)
+        if (const Hsys::ErrorStatus status =
+                addModifier(database, kModifiers[counting], modifiers[counting]);
+            status != Hsys::eSuccess)
+            return status;
+    Ids roomsOf[kFloorCount];
     for (const Room& room : kRooms) {
         HsDbObjectId id;
-        if (const Hsys::ErrorStatus status = addRoom(database, room, halfModifier, id);
+        if (const Hsys::ErrorStatus status = addRoom(database, room, modifiers, id);
             status != Hsys::eSuccess)
             return status;
         roomsOf[room.floor].push_back(id);
     }
     Ids floors;
-    for (const Floor floor : {kGroundFloor, kUpperFloor}) {
+    for (int floor = 0; floor < kFloorCount; ++floor) {
         HsDbObjectId id;
         if (const Hsys::ErrorStatus status =
                 addGroup(database, kFloorNames[floor], {}, roomsOf[floor], id);

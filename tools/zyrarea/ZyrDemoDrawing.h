@@ -9,9 +9,10 @@ class ZyrDemoDrawing {
 public:
     ZyrDemoDrawing() = delete;
 
-    // Adds the plan to a database with the standard records: a house of two floors of rooms (a
-    // balcony counted half through a modifier) and the sample area, in metres shown with two
-    // decimals. The module's style and modifier dictionaries are made when missing. The first
-    // failure is answered; what was added before it stays.
+    // Adds the plan to a database with the standard records: a house of three floors of rooms and
+    // the sample area, in metres shown with two decimals. Two modifier records act on areas: the
+    // attic room under the sloping roof counts half, the balcony a quarter through a formula with
+    // a named parameter. The module's style and modifier dictionaries are made when missing. The
+    // first failure is answered; what was added before it stays.
     [[nodiscard]] static Hsys::ErrorStatus build(HsDbDatabase& database);
 };

@@ -35,18 +35,24 @@ protected:
     }
 };
 
-TEST_F(ZyrAreaToolTest, demoPrintsGroupsBeforeAreasWithSumsAndTheHalfCountedBalcony) {
-    // Rooms are width x depth: Kitchen 4 x 5 is 20 m² with 18 m around it. The balcony, 4 x 1.5,
-    // counts half; the sample area is 80 + 12π less a 22.5 m² triangle.
+TEST_F(ZyrAreaToolTest, demoPrintsGroupsBeforeAreasWithSumsAndEachModifierStep) {
+    // Rooms are width x depth: Kitchen 4 x 5 is 20 m² with 18 m around it. The attic room, 4 x 5
+    // under the sloping roof, counts half; the balcony, 4 x 1.5, a quarter through its parameter
+    // "share". Groups sum their members' net values; perimeters count in full. The sample area is
+    // 80 + 12π less a 22.5 m² triangle.
     const std::wstring expected =
         L"Name             Area gross  Area net  Perimeter gross  Perimeter net\n"
-        L"House              87.00 m²  84.00 m²          90.00 m        90.00 m\n"
+        L"House             107.00 m²  92.50 m²         108.00 m       108.00 m\n"
+        L"  Attic            20.00 m²  10.00 m²          18.00 m        18.00 m\n"
+        L"    Attic room     20.00 m²  10.00 m²          18.00 m        18.00 m\n"
+        L"      Sloping roof: _AREA_VALUE_ * 0.5, Area 20.00 m² before, 10.00 m² after\n"
         L"  Ground floor     60.00 m²  60.00 m²          54.00 m        54.00 m\n"
         L"    Hall           10.00 m²  10.00 m²          14.00 m        14.00 m\n"
         L"    Kitchen        20.00 m²  20.00 m²          18.00 m        18.00 m\n"
         L"    Living room    30.00 m²  30.00 m²          22.00 m        22.00 m\n"
-        L"  Upper floor      27.00 m²  24.00 m²          36.00 m        36.00 m\n"
-        L"    Balcony         6.00 m²   3.00 m²          11.00 m        11.00 m\n"
+        L"  Upper floor      27.00 m²  22.50 m²          36.00 m        36.00 m\n"
+        L"    Balcony         6.00 m²   1.50 m²          11.00 m        11.00 m\n"
+        L"      Balcony share: _AREA_VALUE_ * 0.25, Area 6.00 m² before, 1.50 m² after\n"
         L"    Bath            5.00 m²   5.00 m²           9.00 m         9.00 m\n"
         L"    Bedroom        16.00 m²  16.00 m²          16.00 m        16.00 m\n"
         L"Sample area        95.20 m²  95.20 m²          68.50 m        68.50 m\n";
@@ -55,8 +61,8 @@ TEST_F(ZyrAreaToolTest, demoPrintsGroupsBeforeAreasWithSumsAndTheHalfCountedBalc
     EXPECT_EQ(table(output), expected);
 
     const std::wstring dump = run([] { return ZyrAreaTool::demo({true, ""}); });
-    EXPECT_EQ(dump.find(L"\nArea Calculation\n\n\nRoot node 1\n\nHouse\nArea 87.000000\n"
-                        L"Net area 84.000000\nPerimeter 90.000000\n"),
+    EXPECT_EQ(dump.find(L"\nArea Calculation\n\n\nRoot node 1\n\nHouse\nArea 107.000000\n"
+                        L"Net area 92.500000\nPerimeter 108.000000\n"),
               0u)
         << dump.substr(0, 200);
 }
