@@ -1,5 +1,7 @@
 #include "areacalc/objects/ZyrDbArea.h"
 
+#include "areacalc/calc/ZyrAreaDbOperations.h"
+#include "areacalc/modifiers/ZyrDbAreaModifierOperations.h"
 #include "areacalc/module/ZyrAreaCalculationBaseApp.h"
 #include "areacalc/objects/ZyrDbAreaGroup.h"
 #include "areacalc/objects/ZyrDbAreaStyle.h"
@@ -34,6 +36,8 @@ constexpr unsigned int kStyleLabel = 29010;
 constexpr unsigned int kAreaLabel = 29017;
 constexpr unsigned int kPerimeterLabel = 29018;
 constexpr unsigned int kInvalidProfileNote = 29052;
+constexpr unsigned int kNetAreaLabel = 29048;
+constexpr unsigned int kNetPerimeterLabel = 29049;
 
 ZyrRmCString text(unsigned int id) {
     return ZyrAreaCalculationBaseApp::sStringFromResource(id, false);
@@ -139,14 +143,33 @@ void ZyrImpArea::summaryInfo(ZyrDesc* desc) const {
     ZyrImpGeo::summaryInfo(desc);
     desc->addText(text(kNameLabel), m_name);
     desc->addRecordName(text(kStyleLabel), &m_style, 0);
-    ZyrRmCString areaText;
-    if (m_profile != nullptr && !m_profile->isValidProfile(false))
-        areaText = text(kInvalidProfileNote);
-    else
-        Zyr::formatAreaForDisplay(database(), area(), areaText);
-    desc->addText(text(kAreaLabel), areaText);
+    // The values through modifiers need the public object, which carries the modifiers; an
+    // implementation object on its own has none, so its net values are its gross ones.
+    auto* owner = const_cast<ZyrDbArea*>(ZyrDbArea::cast(dbParent()));
+    std::vector<HsDbObjectId> modifiers;
+    if (ZyrDbAreaModifierOperations::modifiersFor(owner, modifiers) == Hsys::eSuccess)
+        ZyrDbAreaModifierOperations::summaryModifiers(desc, modifiers);
+    double netArea = area();
+    double netPerimeter = perimeter();
+    if (owner != nullptr) {
+        static_cast<void>(ZyrAreaDbOperations::areaModified(owner, netArea));
+        static_cast<void>(ZyrAreaDbOperations::perimeterModified(owner, netPerimeter));
+    }
+    const bool invalid = m_profile != nullptr && !m_profile->isValidProfile(false);
+    desc->addText(text(kAreaLabel), areaForDisplay(area(), invalid));
     desc->addDistance(text(kPerimeterLabel), Zyr::kDrawingDisplaySetting,
                       Zyr::kDrawingDisplaySetting, perimeter());
+    desc->addText(text(kNetAreaLabel), areaForDisplay(netArea, invalid));
+    desc->addDistance(text(kNetPerimeterLabel), Zyr::kDrawingDisplaySetting,
+                      Zyr::kDrawingDisplaySetting, netPerimeter);
+}
+
+ZyrRmCString ZyrImpArea::areaForDisplay(double value, bool invalidProfile) const {
+    if (invalidProfile)
+        return text(kInvalidProfileNote);
+    ZyrRmCString shown;
+    Zyr::formatAreaForDisplay(database(), value, shown);
+    return shown;
 }
 
 Hsys::ErrorStatus ZyrImpArea::subSetDatabaseDefaults(HsDbDatabase* database) {

@@ -80,6 +80,8 @@ public:
     double perimeter() const;
 
 private:
+    // The text of an area value in a summary, or the note for an invalid outline.
+    ZyrRmCString areaForDisplay(double value, bool invalidProfile) const;
     Hsys::ErrorStatus bdfInAreaFields(HsDbBdfFiler* filer);
     Hsys::ErrorStatus bdfOutAreaFields(HsDbBdfFiler* filer) const;
     // The profile's rectangle, refreshed when stale.

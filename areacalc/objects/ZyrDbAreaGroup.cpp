@@ -1,6 +1,8 @@
 #include "areacalc/objects/ZyrDbAreaGroup.h"
 
 #include "areacalc/calc/ZyrAreaCalculationAlgorithm.h"
+#include "areacalc/calc/ZyrAreaGroupDbOperations.h"
+#include "areacalc/modifiers/ZyrDbAreaModifierOperations.h"
 #include "areacalc/module/ZyrAreaCalculationBaseApp.h"
 #include "areacalc/objects/ZyrCollectionFiler.h"
 #include "areacalc/objects/ZyrDbAreaGroupStyle.h"
@@ -13,6 +15,7 @@
 #include "platform/base/relgraph/ZyrAuditUtilities.h"
 #include "platform/base/relgraph/ZyrObjReferenceMap.h"
 #include "platform/base/summary/ZyrDesc.h"
+#include "platform/base/summary/ZyrDisplayFormat.h"
 #include "platform/host/db/HsDbAuditInfo.h"
 #include "platform/host/filer/HsDbFilerSupport.h"
 #include "platform/host/filer/HsDbTdfFiler.h"
@@ -39,6 +42,10 @@ constexpr unsigned int kDirectAreasLabel = 28980;
 constexpr unsigned int kDirectGroupsLabel = 28978;
 constexpr unsigned int kAllAreasLabel = 28981;
 constexpr unsigned int kAllGroupsLabel = 28979;
+constexpr unsigned int kAreaLabel = 29017;
+constexpr unsigned int kPerimeterLabel = 29018;
+constexpr unsigned int kNetAreaLabel = 29048;
+constexpr unsigned int kNetPerimeterLabel = 29049;
 
 // Streams from this version on have the current layout; older ones go to bdfInFieldsQuillon.
 constexpr std::int16_t kFirstCurrentLayout = 31;
@@ -345,6 +352,10 @@ void ZyrImpAreaGroup::summaryInfo(ZyrDesc* desc) const {
                                    ZyrDbArea::desc(), members);
     desc->addText(text(kMembersLabel), members);
     ZyrAreaCalculationAlgorithm::summaryAlgorithms(desc, m_algorithms.items());
+    const auto* owner = ZyrDbAreaGroup::cast(dbParent());
+    std::vector<HsDbObjectId> modifiers;
+    if (ZyrDbAreaModifierOperations::modifiersFor(owner, modifiers) == Hsys::eSuccess)
+        ZyrDbAreaModifierOperations::summaryModifiers(desc, modifiers);
     desc->addRecordName(text(kProposalNamesLabel), &m_proposalNames, 0);
     desc->addCount(text(kDirectAreasLabel), countAlive(m_handlerImp.leafs()));
     desc->addCount(text(kDirectGroupsLabel), countAlive(m_handlerImp.nodes()));
@@ -354,6 +365,21 @@ void ZyrImpAreaGroup::summaryInfo(ZyrDesc* desc) const {
     ZyrGroupHandlerImp::IdList groups;
     static_cast<void>(m_handlerImp.nodes(groups));
     desc->addCount(text(kAllGroupsLabel), countAlive(groups));
+    // A failed calculation shows 0: the statuses are not looked at.
+    double values[4] = {0.0, 0.0, 0.0, 0.0};
+    static_cast<void>(ZyrAreaGroupDbOperations::area(owner, values[0]));
+    static_cast<void>(ZyrAreaGroupDbOperations::perimeter(owner, values[1]));
+    static_cast<void>(ZyrAreaGroupDbOperations::areaModified(owner, values[2]));
+    static_cast<void>(ZyrAreaGroupDbOperations::perimeterModified(owner, values[3]));
+    ZyrRmCString shown;
+    Zyr::formatAreaForDisplay(database(), values[0], shown);
+    desc->addText(text(kAreaLabel), shown);
+    desc->addDistance(text(kPerimeterLabel), Zyr::kDrawingDisplaySetting,
+                      Zyr::kDrawingDisplaySetting, values[1]);
+    Zyr::formatAreaForDisplay(database(), values[2], shown);
+    desc->addText(text(kNetAreaLabel), shown);
+    desc->addDistance(text(kNetPerimeterLabel), Zyr::kDrawingDisplaySetting,
+                      Zyr::kDrawingDisplaySetting, values[3]);
 }
 
 Hsys::ErrorStatus ZyrImpAreaGroup::subSetDatabaseDefaults(HsDbDatabase* database) {

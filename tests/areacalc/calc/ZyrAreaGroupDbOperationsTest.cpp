@@ -5,6 +5,7 @@
 #include "areacalc/calc/ZyrAreaDbOperations.h"
 #include "areacalc/calc/ZyrAreaGroupCalculationFunctor.h"
 #include "areacalc/calc/ZyrAreaGroupDbOperations.h"
+#include "platform/base/summary/ZyrDesc.h"
 
 #include <gtest/gtest.h>
 
@@ -110,6 +111,33 @@ TEST_F(ZyrAreaGroupDbOperationsTest, theFunctorSumsDirectAreasOfAllowingGroupsOn
         sum(group.object());
     }
     EXPECT_NEAR(sum.sum, 4.0 + 9.0, 1e-12) << "the parent's child group is not descended into";
+}
+
+TEST_F(ZyrAreaGroupDbOperationsTest, summariesShowModifiersAndTheNetValuesBesideTheGross) {
+    const HsDbObjectId half = addAreaModifier(L"Half", L"_AREA_VALUE_ * 0.5");
+    const HsDbObjectId room = addRoom(L"Room", 4, 5);
+    attachModifiers(room, {half});
+    const HsDbObjectId floor = addGroup(L"Floor", {}, {room});
+    attachModifiers(floor, {half});
+    const auto summary = [&](const HsDbObjectId& id) {
+        HsDbObjectPointer<ZyrDbEntity> entity(id, HsDb::kForRead);
+        ZyrDesc desc(&database);
+        entity->imp()->summaryInfo(&desc);
+        std::vector<std::wstring> lines;
+        for (const ZyrRmCString& line : desc.lines())
+            if (line.Find(L"Name") != 0 && line.Find(L"Style") < 0)
+                lines.push_back(line.str());
+        return lines;
+    };
+    EXPECT_EQ(summary(room), (std::vector<std::wstring>{
+                                 L"Modifiers: Half", L"Area: 20.00 m\u00b2", L"Perimeter: 18.00 m",
+                                 L"Net area: 10.00 m\u00b2", L"Net perimeter: 18.00 m"}));
+    const std::vector<std::wstring> group = summary(floor);
+    ASSERT_GE(group.size(), 4u);
+    EXPECT_EQ(std::vector<std::wstring>(group.end() - 4, group.end()),
+              (std::vector<std::wstring>{L"Area: 20.00 m\u00b2", L"Perimeter: 18.00 m",
+                                         L"Net area: 5.00 m\u00b2", L"Net perimeter: 18.00 m"}))
+        << "the group's modifier halves the sum of its members' net values";
 }
 
 } // namespace

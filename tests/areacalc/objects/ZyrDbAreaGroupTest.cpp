@@ -356,7 +356,10 @@ TEST_F(ZyrAreaGroups, theSummaryCountsLiveMembersDirectAndBelow) {
                   L"Name: Floor 1", L"Area Group Style: Standard", L"Members: Area Group, Area",
                   L"Calculations: Area", L"Calculations: Perimeter", L"Proposal names: (none)",
                   L"Areas directly in the group: 1", L"Groups directly below: 1",
-                  L"Areas at all levels below: 2", L"Groups at all levels below: 1"}));
+                  L"Areas at all levels below: 2", L"Groups at all levels below: 1",
+                  // The live areas a and c; nothing is modified.
+                  L"Area: 4.00 m\u00b2", L"Perimeter: 12.00 m", L"Net area: 4.00 m\u00b2",
+                  L"Net perimeter: 12.00 m"}));
 }
 
 // An object is modified by the write that records a redraw; the open mode is put back.
