@@ -113,6 +113,26 @@ TEST_F(ZyrAreaGroupDbOperationsTest, theFunctorSumsDirectAreasOfAllowingGroupsOn
     EXPECT_NEAR(sum.sum, 4.0 + 9.0, 1e-12) << "the parent's child group is not descended into";
 }
 
+TEST_F(ZyrAreaGroupDbOperationsTest, aFailingModifierKeepsTheValueOnBothRoadsButOnlyTheShortOneSaysSo) {
+    const HsDbObjectId broken = addAreaModifier(L"Broken", L"_AREA_VALUE_ / 0");
+    const HsDbObjectId half = addAreaModifier(L"Half", L"_AREA_VALUE_ * 0.5");
+    const HsDbObjectId failsLast = addRoom(L"FailsLast", 4, 5);
+    const HsDbObjectId failsFirst = addRoom(L"FailsFirst", 2, 5);
+    attachModifiers(failsLast, {half, broken});
+    attachModifiers(failsFirst, {broken, half});
+    ASSERT_EQ(calculate({failsLast, failsFirst}), Hsys::eSuccess) << "the engine ignores the failure";
+    double last = -1.0;
+    double first = -1.0;
+    EXPECT_NE(ZyrAreaDbOperations::areaModified(failsLast, last), Hsys::eSuccess);
+    EXPECT_EQ(ZyrAreaDbOperations::areaModified(failsFirst, first), Hsys::eSuccess)
+        << "a later success hides the earlier failure";
+    EXPECT_NEAR(last, 10.0, 1e-12);
+    EXPECT_NEAR(first, 5.0, 1e-12);
+    // Roots are sorted by name: FailsFirst, then FailsLast.
+    EXPECT_NEAR(data(*stream.roots()[0], areaAlgorithm())->netValue, first, 1e-12);
+    EXPECT_NEAR(data(*stream.roots()[1], areaAlgorithm())->netValue, last, 1e-12);
+}
+
 TEST_F(ZyrAreaGroupDbOperationsTest, summariesShowModifiersAndTheNetValuesBesideTheGross) {
     const HsDbObjectId half = addAreaModifier(L"Half", L"_AREA_VALUE_ * 0.5");
     const HsDbObjectId room = addRoom(L"Room", 4, 5);
