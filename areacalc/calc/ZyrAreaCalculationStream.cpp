@@ -83,25 +83,56 @@ ZyrModifierData* ZyrAreaCalculationStream::modifierData(const ZyrModifierBlock& 
     return m_modifierDatas[static_cast<size_t>(block.modifierIndex)];
 }
 
-namespace {
-
-bool findFirstPosition(const std::unordered_map<HsDbObjectId, int>& positions,
-                       const HsDbObjectId& objectId, int& index) {
-    const auto found = positions.find(objectId);
-    if (found == positions.end())
-        return false;
-    index = found->second;
-    return true;
+size_t ZyrAreaCalculationStream::FirstPositions::slotOf(const HsDbObjectId& objectId) const {
+    // Entries are allocated objects: the low bits carry no information, the multiplication
+    // spreads the rest over the top bits, which pick the slot.
+    const auto bits = reinterpret_cast<std::uintptr_t>(objectId.entry());
+    const std::uint64_t mixed = static_cast<std::uint64_t>(bits) * 0x9E3779B97F4A7C15ull;
+    return static_cast<size_t>(mixed >> 32) & (m_slots.size() - 1);
 }
 
-} // namespace
+bool ZyrAreaCalculationStream::FirstPositions::find(const HsDbObjectId& objectId,
+                                                    int& index) const {
+    if (m_slots.empty())
+        return false;
+    for (size_t slot = slotOf(objectId);; slot = (slot + 1) & (m_slots.size() - 1)) {
+        const Slot& entry = m_slots[slot];
+        if (entry.index < 0)
+            return false;
+        if (entry.objectId == objectId) {
+            index = entry.index;
+            return true;
+        }
+    }
+}
+
+void ZyrAreaCalculationStream::FirstPositions::insert(const HsDbObjectId& objectId, int index) {
+    // At most half full, so that a probe ends soon on a free slot.
+    if (2 * (m_used + 1) > m_slots.size())
+        grow();
+    size_t slot = slotOf(objectId);
+    for (; m_slots[slot].index >= 0; slot = (slot + 1) & (m_slots.size() - 1))
+        if (m_slots[slot].objectId == objectId)
+            return;
+    m_slots[slot] = {objectId, index};
+    ++m_used;
+}
+
+void ZyrAreaCalculationStream::FirstPositions::grow() {
+    std::vector<Slot> old(std::max<size_t>(64, 2 * m_slots.size()));
+    old.swap(m_slots);
+    m_used = 0;
+    for (const Slot& entry : old)
+        if (entry.index >= 0)
+            insert(entry.objectId, entry.index);
+}
 
 bool ZyrAreaCalculationStream::hasNodeHeaderFor(const HsDbObjectId& objectId, int& index) const {
-    return findFirstPosition(m_headerPositions, objectId, index);
+    return m_headerPositions.find(objectId, index);
 }
 
 bool ZyrAreaCalculationStream::hasModifierDataFor(const HsDbObjectId& objectId, int& index) const {
-    return findFirstPosition(m_modifierPositions, objectId, index);
+    return m_modifierPositions.find(objectId, index);
 }
 
 bool ZyrAreaCalculationStream::hasNodeDataFor(const HsDbObjectId& objectId,
@@ -162,15 +193,15 @@ void ZyrAreaCalculationStreamWriter::appendRoot(ZyrCalculationNode* node) {
 
 namespace {
 
-template <class Record>
-int appendIndexed(std::vector<Record*>& table, std::unordered_map<HsDbObjectId, int>& positions,
-                  Record* record, const char* what) {
+template <class Record, class Positions>
+int appendIndexed(std::vector<Record*>& table, Positions& positions, Record* record,
+                  const char* what) {
     if (record == nullptr)
         throw HsAssertionViolation(std::string("a calculation stream takes no null ") + what);
     const int index = static_cast<int>(table.size());
     table.push_back(record);
     // The first record of an object stays the one that is found.
-    positions.try_emplace(record->objectId, index);
+    positions.insert(record->objectId, index);
     return index;
 }
 

@@ -6,7 +6,6 @@
 #include "platform/host/db/HsDbObjectId.h"
 
 #include <cstdint>
-#include <unordered_map>
 #include <vector>
 
 class ZyrPrimitiveExpressionHandlerFactory;
@@ -146,7 +145,32 @@ public:
 
 private:
     friend class ZyrAreaCalculationStreamWriter;
-    using FirstPositions = std::unordered_map<HsDbObjectId, int>;
+
+    // The first table position of each object id, in one flat array probed linearly: a
+    // calculation adds a header for nearly every object, and chained nodes cost an allocation
+    // and a cache miss each.
+    class FirstPositions {
+    public:
+        bool find(const HsDbObjectId& objectId, int& index) const;
+        // Keeps the position already entered for the id.
+        void insert(const HsDbObjectId& objectId, int index);
+        void clear() {
+            m_slots.clear();
+            m_used = 0;
+        }
+
+    private:
+        struct Slot {
+            HsDbObjectId objectId;
+            // Negative while the slot is free.
+            int index = -1;
+        };
+        size_t slotOf(const HsDbObjectId& objectId) const;
+        void grow();
+
+        std::vector<Slot> m_slots;
+        size_t m_used = 0;
+    };
 
     void dumpNodeData(const ZyrCalculationNodeData& data) const;
 
