@@ -13,7 +13,7 @@
 #include "platform/base/geom/ZyrGeRing.h"
 #include "platform/base/geom/ZyrGeSegment2d.h"
 #include "platform/host/db/HsDbDatabase.h"
-#include "tools/zyrarea/ZyrAreaToolSession.h"
+#include "tools/zyrarea/ZyrAreaToolHost.h"
 
 #include <benchmark/benchmark.h>
 
@@ -36,8 +36,8 @@ void check(Hsys::ErrorStatus status, const char* what) {
         throw std::runtime_error(std::string(what) + ": " + Hsys::toString(status));
 }
 
-ZyrAreaToolSession& session() {
-    static ZyrAreaToolSession running;
+ZyrAreaToolHost& host() {
+    static ZyrAreaToolHost running;
     check(running.status(), "starting the module");
     return running;
 }
@@ -69,7 +69,7 @@ HsDbObjectId addGroup(HsDbDatabase& database, const std::wstring& name, const Id
 // A site of buildings of floors of rooms, all rooms of different sizes; made once per size.
 struct Site {
     explicit Site(size_t areaCount) {
-        session();
+        host();
         if (!ZyrDictAreaStyle(&database).isValid(true, true) ||
             !ZyrDictAreaGroupStyle(&database).isValid(true, true))
             throw std::runtime_error("no style dictionaries");

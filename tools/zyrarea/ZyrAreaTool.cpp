@@ -6,7 +6,7 @@
 #include "platform/host/ut/HsutConsole.h"
 #include "platform/host/ut/HsutUtf8.h"
 #include "tools/zyrarea/ZyrAreaCalculationReport.h"
-#include "tools/zyrarea/ZyrAreaToolSession.h"
+#include "tools/zyrarea/ZyrAreaToolHost.h"
 #include "tools/zyrarea/ZyrDemoDrawing.h"
 
 #include <iostream>
@@ -42,9 +42,9 @@ int calculateAndShow(HsDbDatabase& database, const std::string& title,
 } // namespace
 
 int ZyrAreaTool::demo(const Options& options) {
-    const ZyrAreaToolSession session;
-    if (session.status() != Hsys::eSuccess)
-        return fail("starting the area module", session.status());
+    const ZyrAreaToolHost host;
+    if (host.status() != Hsys::eSuccess)
+        return fail("starting the area module", host.status());
     HsDbDatabase database;
     if (const Hsys::ErrorStatus status = ZyrDemoDrawing::build(database); status != Hsys::eSuccess)
         return fail("building the demo drawing", status);
@@ -59,9 +59,9 @@ int ZyrAreaTool::demo(const Options& options) {
 }
 
 int ZyrAreaTool::calc(const std::string& drawingFile, const Options& options) {
-    const ZyrAreaToolSession session;
-    if (session.status() != Hsys::eSuccess)
-        return fail("starting the area module", session.status());
+    const ZyrAreaToolHost host;
+    if (host.status() != Hsys::eSuccess)
+        return fail("starting the area module", host.status());
     HsDbDatabase database(HsDb::kEmptyDatabase);
     std::wstring reason;
     if (const Hsys::ErrorStatus status =

@@ -408,9 +408,9 @@ TEST_F(ZyrAreaGroups, classesRegisterAsTheClassTableHasThem) {
     EXPECT_EQ(shown, L"Area Group");
     EXPECT_EQ(ZyrDictAreaGroupStyle(&database).objectClass(), ZyrDbAreaGroup::desc());
 
-    std::unique_ptr<HsRxObject> spec(ZyrCompSpecAreaGroup::desc()->create());
-    ASSERT_EQ(spec->isA(), ZyrCompSpecAreaGroup::desc());
-    EXPECT_EQ(static_cast<ZyrCompSpecAreaGroup*>(spec.get())->worksWith(), ZyrDbAreaGroup::desc());
+    std::unique_ptr<HsRxObject> compSpec(ZyrCompSpecAreaGroup::desc()->create());
+    ASSERT_EQ(compSpec->isA(), ZyrCompSpecAreaGroup::desc());
+    EXPECT_EQ(static_cast<ZyrCompSpecAreaGroup*>(compSpec.get())->worksWith(), ZyrDbAreaGroup::desc());
 }
 
 } // namespace

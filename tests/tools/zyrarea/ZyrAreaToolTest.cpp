@@ -1,7 +1,7 @@
 // The tool's jobs run in-process: the demo plan's figures, which a reader can check by hand, and
 // the same figures from the drawing file the demo writes.
 #include "tools/zyrarea/ZyrAreaTool.h"
-#include "tools/zyrarea/ZyrAreaToolSession.h"
+#include "tools/zyrarea/ZyrAreaToolHost.h"
 
 #include "platform/host/ut/HsutConsole.h"
 
@@ -19,8 +19,8 @@ public:
     // Keeps the module's service alive between the jobs, each of which takes and gives back a
     // dependency of its own: the service dies for good when the last one goes.
     static void SetUpTestSuite() {
-        static ZyrAreaToolSession session;
-        ASSERT_EQ(session.status(), Hsys::eSuccess);
+        static ZyrAreaToolHost host;
+        ASSERT_EQ(host.status(), Hsys::eSuccess);
     }
 
 protected:

@@ -8,14 +8,14 @@
 
 class ZyrAppHdx;
 
-class ZyrAreaToolSession {
+class ZyrAreaToolHost {
 public:
     // Registering the classes twice in one process is harmless; the service is taken by one
-    // client for the life of the session.
-    ZyrAreaToolSession();
-    ~ZyrAreaToolSession();
-    ZyrAreaToolSession(const ZyrAreaToolSession&) = delete;
-    ZyrAreaToolSession& operator=(const ZyrAreaToolSession&) = delete;
+    // client for the life of the host.
+    ZyrAreaToolHost();
+    ~ZyrAreaToolHost();
+    ZyrAreaToolHost(const ZyrAreaToolHost&) = delete;
+    ZyrAreaToolHost& operator=(const ZyrAreaToolHost&) = delete;
 
     // eSuccess when the service runs and both algorithms are attached.
     Hsys::ErrorStatus status() const { return m_status; }

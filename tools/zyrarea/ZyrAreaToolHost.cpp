@@ -1,4 +1,4 @@
-#include "tools/zyrarea/ZyrAreaToolSession.h"
+#include "tools/zyrarea/ZyrAreaToolHost.h"
 
 #include "areacalc/calc/ZyrAreaCalculationAreaAlgorithm.h"
 #include "areacalc/calc/ZyrAreaCalculationPerimeterAlgorithm.h"
@@ -18,7 +18,7 @@ AFX_EXTENSION_MODULE gClientExtension;
 
 } // namespace
 
-ZyrAreaToolSession::ZyrAreaToolSession() {
+ZyrAreaToolHost::ZyrAreaToolHost() {
     _hdllInstance = &gModuleImage;
     ZyrAreaCalculationBaseTexts::registerTexts();
     ZyrDecoratorManager::bindModule(_hdllInstance, ZyrAreaCalculationBaseApp::kAppName);
@@ -30,11 +30,11 @@ ZyrAreaToolSession::ZyrAreaToolSession() {
         m_status = attachAlgorithms();
 }
 
-ZyrAreaToolSession::~ZyrAreaToolSession() {
+ZyrAreaToolHost::~ZyrAreaToolHost() {
     ZyrAreaCalculationHdxServices::unRegisterService(m_client.get());
 }
 
-Hsys::ErrorStatus ZyrAreaToolSession::attachAlgorithms() {
+Hsys::ErrorStatus ZyrAreaToolHost::attachAlgorithms() {
     ZyrAreaCalculationHdxServices* services = ZyrAreaCalculationHdxServices::service();
     ZyrAreaCalculationWhiteBoard* board = services != nullptr ? services->whiteBoard() : nullptr;
     if (board == nullptr)
