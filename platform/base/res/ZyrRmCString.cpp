@@ -79,7 +79,7 @@ struct Insert {
 } // namespace
 
 ZyrRmCString::ZyrRmCString(const wchar_t* appName, unsigned int id, bool stripMnemonics) {
-    const std::wstring app = appName != nullptr ? appName : L"";
+    const std::wstring_view app = appName != nullptr ? appName : L"";
     const std::wstring* text = ZyrTextResources::find(app, id);
     if (text == nullptr)
         m_text = ZyrTextResources::placeholder(app, id);

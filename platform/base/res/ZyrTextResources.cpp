@@ -1,8 +1,12 @@
 #include "platform/base/res/ZyrTextResources.h"
 
 namespace {
-std::map<std::wstring, ZyrTextResources::Table>& tables() {
-    static std::map<std::wstring, ZyrTextResources::Table> registered;
+// Looked up by a view of the name: texts are read once per calculation record, and building a
+// string for every lookup would cost an allocation each time.
+using Tables = std::map<std::wstring, ZyrTextResources::Table, std::less<>>;
+
+Tables& tables() {
+    static Tables registered;
     return registered;
 }
 } // namespace
@@ -15,7 +19,7 @@ void ZyrTextResources::unregisterTable(const std::wstring& appName) { tables().e
 
 bool ZyrTextResources::hasTable(const std::wstring& appName) { return tables().count(appName) != 0; }
 
-const std::wstring* ZyrTextResources::find(const std::wstring& appName, unsigned int id) {
+const std::wstring* ZyrTextResources::find(std::wstring_view appName, unsigned int id) {
     auto table = tables().find(appName);
     if (table == tables().end())
         return nullptr;
@@ -23,6 +27,6 @@ const std::wstring* ZyrTextResources::find(const std::wstring& appName, unsigned
     return text != table->second.end() ? &text->second : nullptr;
 }
 
-std::wstring ZyrTextResources::placeholder(const std::wstring& appName, unsigned int id) {
-    return L"<missing text " + std::to_wstring(id) + L" of " + appName + L">";
+std::wstring ZyrTextResources::placeholder(std::wstring_view appName, unsigned int id) {
+    return L"<missing text " + std::to_wstring(id) + L" of " + std::wstring(appName) + L">";
 }

@@ -4,6 +4,7 @@
 
 #include <map>
 #include <string>
+#include <string_view>
 
 class ZyrTextResources {
 public:
@@ -15,8 +16,8 @@ public:
     static bool hasTable(const std::wstring& appName);
 
     // The wording, or null when the module or the number is unknown.
-    static const std::wstring* find(const std::wstring& appName, unsigned int id);
+    static const std::wstring* find(std::wstring_view appName, unsigned int id);
 
     // What an unknown text reads as: visible, and naming what is missing.
-    static std::wstring placeholder(const std::wstring& appName, unsigned int id);
+    static std::wstring placeholder(std::wstring_view appName, unsigned int id);
 };
