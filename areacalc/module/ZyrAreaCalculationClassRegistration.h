@@ -53,6 +53,18 @@ private:                                                                        
                                                                                                    \
 public:
 
+// What every class of the module defines after its rxInit: desc and isA through the cached
+// descriptor, and the decorator that registers the class with the module.
+#define ZYR_AREACALC_DEFINE_DESC_AND_DECORATOR(CLASS, PARENT, NAME_ID, SECOND_ID)                  \
+    HsRxClass* CLASS::desc() {                                                                     \
+        return ZyrAreaCalculationClassRegistration::desc(gpDesc, L"" #CLASS);                      \
+    }                                                                                              \
+    HsRxClass* CLASS::isA() const {                                                                \
+        return CLASS::desc();                                                                      \
+    }                                                                                              \
+    ZyrRxClassDecorator gZyrDecorator##CLASS(typeid(CLASS), typeid(PARENT), &CLASS::rxInit,        \
+                                             &CLASS::desc, &_hdllInstance, NAME_ID, SECOND_ID);
+
 // FLAGS are the proxy flags, CONSTRUCTOR the pseudo constructor or nullptr; NAME_ID and SECOND_ID
 // are the decorator's text ids, ZyrRxClassDecorator::kNoText for none.
 #define ZYR_AREACALC_DEFINE_MEMBERS(CLASS, PARENT, FLAGS, CONSTRUCTOR, NAME_ID, SECOND_ID)         \
@@ -62,11 +74,4 @@ public:
             gpDesc, L"" #CLASS, ZyrAreaCalculationClassRegistration::parentClass<PARENT>(), FLAGS, \
             CONSTRUCTOR);                                                                          \
     }                                                                                              \
-    HsRxClass* CLASS::desc() {                                                                     \
-        return ZyrAreaCalculationClassRegistration::desc(gpDesc, L"" #CLASS);                      \
-    }                                                                                              \
-    HsRxClass* CLASS::isA() const {                                                                \
-        return CLASS::desc();                                                                      \
-    }                                                                                              \
-    ZyrRxClassDecorator gZyrDecorator##CLASS(typeid(CLASS), typeid(PARENT), &CLASS::rxInit,        \
-                                             &CLASS::desc, &_hdllInstance, NAME_ID, SECOND_ID);
+    ZYR_AREACALC_DEFINE_DESC_AND_DECORATOR(CLASS, PARENT, NAME_ID, SECOND_ID)

@@ -155,11 +155,4 @@ private:
             CLASS::kProxyFlags, hsrxInstantiateClass<CLASS>, RECORD_NAME,                          \
             ZyrAreaCalculationBaseApp::kClassAppDescription, appDataCallback);                     \
     }                                                                                              \
-    HsRxClass* CLASS::desc() {                                                                     \
-        return ZyrAreaCalculationClassRegistration::desc(gpDesc, L"" #CLASS);                      \
-    }                                                                                              \
-    HsRxClass* CLASS::isA() const {                                                                \
-        return CLASS::desc();                                                                      \
-    }                                                                                              \
-    ZyrRxClassDecorator gZyrDecorator##CLASS(typeid(CLASS), typeid(PARENT), &CLASS::rxInit,        \
-                                             &CLASS::desc, &_hdllInstance, NAME_ID, SECOND_ID);
+    ZYR_AREACALC_DEFINE_DESC_AND_DECORATOR(CLASS, PARENT, NAME_ID, SECOND_ID)

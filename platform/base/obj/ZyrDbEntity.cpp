@@ -16,18 +16,7 @@ HSRX_DEFINE_MEMBERS(ZyrDbEntity, HsDbEntity, 0, hsrxInstantiateClass<ZyrDbEntity
 
 namespace {
 
-// A nested object's head takes at least its kind word.
-constexpr std::size_t kMinNestedSize = 2;
-
 using OwnedOverrides = std::vector<std::unique_ptr<ZyrOverride>>;
-
-std::vector<ZyrOverride*> released(OwnedOverrides& owned) {
-    std::vector<ZyrOverride*> pointers;
-    pointers.reserve(owned.size());
-    for (std::unique_ptr<ZyrOverride>& override : owned)
-        pointers.push_back(override.release());
-    return pointers;
-}
 
 } // namespace
 
@@ -58,7 +47,7 @@ Hsys::ErrorStatus ZyrDbEntity::copyFrom(const HsRxObject* other) {
     if (const Hsys::ErrorStatus status = copyImpFrom(*source); status != Hsys::eSuccess)
         return status;
     deleteOverrides();
-    m_overrides = released(copies);
+    m_overrides = zyrtl::releaseAll(copies);
     for (ZyrOverride* override : m_overrides)
         override->setParent(static_cast<HsDbObject*>(this));
     recordReferencesModified();
@@ -109,7 +98,7 @@ Hsys::ErrorStatus ZyrDbEntity::bdfInOverrides(HsDbBdfFiler* filer) {
     std::uint32_t count = 0;
     if (filer->readUInt32(count) != Hsys::eSuccess)
         return filer->filerStatus();
-    if (count > filer->remaining() / kMinNestedSize) {
+    if (count > filer->remaining() / Zyr::kMinNestedObjectSize) {
         filer->setFilerStatus(Hsys::eFilerError);
         return Hsys::eFilerError;
     }
@@ -129,7 +118,7 @@ Hsys::ErrorStatus ZyrDbEntity::bdfInOverrides(HsDbBdfFiler* filer) {
         read.emplace_back(override);
     }
     deleteOverrides();
-    m_overrides = released(read);
+    m_overrides = zyrtl::releaseAll(read);
     return Hsys::eSuccess;
 }
 

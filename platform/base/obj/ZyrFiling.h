@@ -4,6 +4,7 @@
 
 #include "platform/host/ut/HsysErrorStatus.h"
 
+#include <cstddef>
 #include <cstdint>
 
 class HsDbBdfFiler;
@@ -22,6 +23,10 @@ inline constexpr std::int16_t kCurrentVersion = 80;
 // Streams of versions 20 to 29 carried one bool after each level's version word, read and dropped.
 inline constexpr std::int16_t kFirstVersionWithDroppedBool = 20;
 inline constexpr std::int16_t kLastVersionWithDroppedBool = 29;
+
+// The fewest bytes a nested object takes in a stream (its kind word): a reader checks a count of
+// nested objects against it before reserving anything.
+inline constexpr std::size_t kMinNestedObjectSize = 2;
 
 // Writes a level's version word: int16 kCurrentVersion. The filer's status.
 Hsys::ErrorStatus bdfWriteVersion(HsDbBdfFiler* filer);

@@ -14,18 +14,7 @@ HSRX_DEFINE_MEMBERS(ZyrImpArray, ZyrImpObj, 0, hsrxInstantiateClass<ZyrImpArray>
 
 namespace {
 
-// A nested object's head takes at least its kind word.
-constexpr std::size_t kMinNestedSize = 2;
-
 using OwnedEntries = std::vector<std::unique_ptr<ZyrImpObj>>;
-
-std::vector<ZyrImpObj*> released(OwnedEntries& owned) {
-    std::vector<ZyrImpObj*> pointers;
-    pointers.reserve(owned.size());
-    for (std::unique_ptr<ZyrImpObj>& entry : owned)
-        pointers.push_back(entry.release());
-    return pointers;
-}
 
 Hsys::ErrorStatus failTdf(HsDbTdfFiler* filer, const wchar_t* message) {
     filer->setError(Hsys::eBadTdfSequence, message);
@@ -68,7 +57,7 @@ Hsys::ErrorStatus ZyrImpArray::copyFrom(const HsRxObject* other) {
             return Hsys::eBadArgument;
     }
     assertParentWriteEnabled();
-    replaceEntries(released(copies));
+    replaceEntries(zyrtl::releaseAll(copies));
     return Hsys::eSuccess;
 }
 
@@ -82,7 +71,7 @@ Hsys::ErrorStatus ZyrImpArray::bdfInOwnFields(HsDbBdfFiler* filer) {
     std::uint32_t count = 0;
     if (filer->readUInt32(count) != Hsys::eSuccess)
         return filer->filerStatus();
-    if (count > filer->remaining() / kMinNestedSize) {
+    if (count > filer->remaining() / Zyr::kMinNestedObjectSize) {
         filer->setFilerStatus(Hsys::eFilerError);
         return Hsys::eFilerError;
     }
@@ -100,7 +89,7 @@ Hsys::ErrorStatus ZyrImpArray::bdfInOwnFields(HsDbBdfFiler* filer) {
         }
         read.emplace_back(entry);
     }
-    replaceEntries(released(read));
+    replaceEntries(zyrtl::releaseAll(read));
     return filer->filerStatus();
 }
 
@@ -145,7 +134,7 @@ Hsys::ErrorStatus ZyrImpArray::tdfInFields(HsDbTdfFiler* filer) {
             return status;
         read.emplace_back(entry);
     }
-    replaceEntries(released(read));
+    replaceEntries(zyrtl::releaseAll(read));
     return filer->filerStatus();
 }
 

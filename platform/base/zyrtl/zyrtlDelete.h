@@ -1,6 +1,9 @@
 // Deleting the owned pointers that containers hold.
 #pragma once
 
+#include <memory>
+#include <vector>
+
 namespace zyrtl {
 
 template <class T> struct deleteItem;
@@ -18,6 +21,16 @@ template <class Container> void deleteItems(Container& container) {
     for (auto* item : container)
         delete item;
     container.clear();
+}
+
+// Hands the objects of a list of owners over as plain pointers, for an owner that keeps plain ones;
+// the list is left holding nulls.
+template <class T> std::vector<T*> releaseAll(std::vector<std::unique_ptr<T>>& owned) {
+    std::vector<T*> pointers;
+    pointers.reserve(owned.size());
+    for (std::unique_ptr<T>& item : owned)
+        pointers.push_back(item.release());
+    return pointers;
 }
 
 } // namespace zyrtl
