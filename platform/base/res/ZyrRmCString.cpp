@@ -78,19 +78,42 @@ struct Insert {
 
 } // namespace
 
+ZyrRmCString::ZyrRmCString(const wchar_t* text)
+    : ZyrRmCString(std::wstring(text != nullptr ? text : L"")) {}
+
+ZyrRmCString::ZyrRmCString(std::wstring text) {
+    if (!text.empty())
+        m_text = std::make_shared<std::wstring>(std::move(text));
+}
+
 ZyrRmCString::ZyrRmCString(const wchar_t* appName, unsigned int id, bool stripMnemonics) {
     const std::wstring_view app = appName != nullptr ? appName : L"";
-    const std::wstring* text = ZyrTextResources::find(app, id);
+    const ZyrRmCString* text = ZyrTextResources::find(app, id);
     if (text == nullptr)
-        m_text = ZyrTextResources::placeholder(app, id);
+        *this = ZyrTextResources::placeholder(app, id);
     else
-        m_text = stripMnemonics ? withoutMnemonics(*text) : *text;
+        *this = stripMnemonics ? ZyrRmCString(withoutMnemonics(text->str())) : *text;
+}
+
+const std::wstring& ZyrRmCString::emptyText() {
+    static const std::wstring empty;
+    return empty;
+}
+
+std::wstring& ZyrRmCString::writable() {
+    // A buffer used by this copy alone can change in place: no other copy can appear meanwhile
+    // but by copying this very object.
+    if (m_text == nullptr)
+        m_text = std::make_shared<std::wstring>();
+    else if (m_text.use_count() != 1)
+        m_text = std::make_shared<std::wstring>(*m_text);
+    return *m_text;
 }
 
 void ZyrRmCString::Format(const wchar_t* format, ...) {
     va_list args;
     va_start(args, format);
-    m_text = hsutVFormat(format, args);
+    *this = hsutVFormat(format, args);
     va_end(args);
 }
 
@@ -140,18 +163,19 @@ void ZyrRmCString::FormatMessage(const wchar_t* format, ...) {
         values[index] = formatPositional(directive, args);
     va_end(args);
 
-    m_text.clear();
+    std::wstring text;
     for (const Insert& piece : pieces)
-        m_text += piece.index == 0 ? pattern.substr(piece.begin, piece.end - piece.begin)
-                                   : values[piece.index];
+        text += piece.index == 0 ? pattern.substr(piece.begin, piece.end - piece.begin)
+                                 : values[piece.index];
+    *this = std::move(text);
 }
 
 int ZyrRmCString::Compare(const wchar_t* other) const {
-    return sign(std::wcscmp(m_text.c_str(), other != nullptr ? other : L""));
+    return sign(std::wcscmp(GetString(), other != nullptr ? other : L""));
 }
 
 int ZyrRmCString::CompareNoCase(const wchar_t* other) const {
-    const wchar_t* a = m_text.c_str();
+    const wchar_t* a = GetString();
     const wchar_t* b = other != nullptr ? other : L"";
     for (;; ++a, ++b) {
         const wchar_t fa = foldClassic(*a);
@@ -164,16 +188,16 @@ int ZyrRmCString::CompareNoCase(const wchar_t* other) const {
 }
 
 int ZyrRmCString::Find(wchar_t c, int start) const {
-    if (start < 0 || static_cast<size_t>(start) > m_text.size())
+    if (start < 0 || static_cast<size_t>(start) > str().size())
         return -1;
-    const size_t at = m_text.find(c, static_cast<size_t>(start));
+    const size_t at = str().find(c, static_cast<size_t>(start));
     return at == std::wstring::npos ? -1 : static_cast<int>(at);
 }
 
 int ZyrRmCString::Find(const wchar_t* sub, int start) const {
-    if (sub == nullptr || start < 0 || static_cast<size_t>(start) > m_text.size())
+    if (sub == nullptr || start < 0 || static_cast<size_t>(start) > str().size())
         return -1;
-    const size_t at = m_text.find(sub, static_cast<size_t>(start));
+    const size_t at = str().find(sub, static_cast<size_t>(start));
     return at == std::wstring::npos ? -1 : static_cast<int>(at);
 }
 
@@ -182,25 +206,29 @@ int ZyrRmCString::Replace(const wchar_t* from, const wchar_t* to) {
         return 0;
     const std::wstring pattern = from;
     const std::wstring replacement = to != nullptr ? to : L"";
+    size_t at = str().find(pattern);
+    // Without a match the buffer stays shared.
+    if (at == std::wstring::npos)
+        return 0;
+    std::wstring& text = writable();
     int count = 0;
-    for (size_t at = m_text.find(pattern); at != std::wstring::npos;
-         at = m_text.find(pattern, at + replacement.size())) {
-        m_text.replace(at, pattern.size(), replacement);
+    for (; at != std::wstring::npos; at = text.find(pattern, at + replacement.size())) {
+        text.replace(at, pattern.size(), replacement);
         ++count;
     }
     return count;
 }
 
 ZyrRmCString ZyrRmCString::Left(int count) const {
-    return m_text.substr(0, static_cast<size_t>(std::max(count, 0)));
+    return str().substr(0, static_cast<size_t>(std::max(count, 0)));
 }
 
 ZyrRmCString ZyrRmCString::Mid(int first, int count) const {
-    const size_t from = std::min(static_cast<size_t>(std::max(first, 0)), m_text.size());
-    return m_text.substr(from, count < 0 ? std::wstring::npos : static_cast<size_t>(count));
+    const size_t from = std::min(static_cast<size_t>(std::max(first, 0)), str().size());
+    return str().substr(from, count < 0 ? std::wstring::npos : static_cast<size_t>(count));
 }
 
 ZyrRmCString ZyrRmCString::Right(int count) const {
-    const size_t n = std::min(static_cast<size_t>(std::max(count, 0)), m_text.size());
-    return m_text.substr(m_text.size() - n);
+    const size_t n = std::min(static_cast<size_t>(std::max(count, 0)), str().size());
+    return str().substr(str().size() - n);
 }

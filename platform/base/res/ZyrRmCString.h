@@ -1,26 +1,27 @@
 // The system string: wide characters, one code point each.
 #pragma once
 
+#include <memory>
 #include <string>
 #include <vector>
 
 class ZyrRmCString {
 public:
     ZyrRmCString() = default;
-    ZyrRmCString(const wchar_t* text) : m_text(text != nullptr ? text : L"") {}
-    ZyrRmCString(std::wstring text) : m_text(std::move(text)) {}
+    ZyrRmCString(const wchar_t* text);
+    ZyrRmCString(std::wstring text);
     // The text of a module's resource. With stripMnemonics the '&' that marks a menu mnemonic is
     // dropped ("&&" stays as one '&'), for texts shown as plain labels such as column names. An
     // unknown module or number gives a visible placeholder.
     ZyrRmCString(const wchar_t* appName, unsigned int id, bool stripMnemonics);
 
-    int GetLength() const { return static_cast<int>(m_text.size()); }
-    bool IsEmpty() const { return m_text.empty(); }
-    void Empty() { m_text.clear(); }
-    const wchar_t* GetString() const { return m_text.c_str(); }
-    operator const wchar_t*() const { return m_text.c_str(); }
-    const std::wstring& str() const { return m_text; }
-    wchar_t GetAt(int index) const { return m_text.at(static_cast<size_t>(index)); }
+    int GetLength() const { return static_cast<int>(str().size()); }
+    bool IsEmpty() const { return str().empty(); }
+    void Empty() { m_text.reset(); }
+    const wchar_t* GetString() const { return str().c_str(); }
+    operator const wchar_t*() const { return str().c_str(); }
+    const std::wstring& str() const { return m_text != nullptr ? *m_text : emptyText(); }
+    wchar_t GetAt(int index) const { return str().at(static_cast<size_t>(index)); }
 
     // printf-style, with the host's wide conventions ("%s" wide, "%S" and "%hs" UTF-8).
     void Format(const wchar_t* format, ...);
@@ -44,24 +45,31 @@ public:
     ZyrRmCString Right(int count) const;
 
     ZyrRmCString& operator+=(const ZyrRmCString& other) {
-        m_text += other.m_text;
+        writable() += other.str();
         return *this;
     }
     ZyrRmCString& operator+=(const wchar_t* other) {
-        m_text += other != nullptr ? other : L"";
+        writable() += other != nullptr ? other : L"";
         return *this;
     }
     ZyrRmCString& operator+=(wchar_t c) {
-        m_text += c;
+        writable() += c;
         return *this;
     }
     friend ZyrRmCString operator+(ZyrRmCString left, const ZyrRmCString& right) { return left += right; }
-    friend bool operator==(const ZyrRmCString& a, const ZyrRmCString& b) { return a.m_text == b.m_text; }
+    friend bool operator==(const ZyrRmCString& a, const ZyrRmCString& b) { return a.str() == b.str(); }
     friend bool operator==(const ZyrRmCString& a, const wchar_t* b) { return a.Compare(b) == 0; }
-    friend auto operator<=>(const ZyrRmCString& a, const ZyrRmCString& b) { return a.m_text <=> b.m_text; }
+    friend auto operator<=>(const ZyrRmCString& a, const ZyrRmCString& b) { return a.str() <=> b.str(); }
 
 private:
-    std::wstring m_text;
+    static const std::wstring& emptyText();
+    // The text alone, no longer shared with any copy.
+    std::wstring& writable();
+
+    // Copies share one buffer until one of them changes: texts are copied far more often than
+    // changed (every calculation record carries its names), and a copy must cost no allocation.
+    // Null is the empty text.
+    std::shared_ptr<std::wstring> m_text;
 };
 
 using ZyrRmCStringArray = std::vector<ZyrRmCString>;

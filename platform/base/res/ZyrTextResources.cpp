@@ -3,7 +3,7 @@
 namespace {
 // Looked up by a view of the name: texts are read once per calculation record, and building a
 // string for every lookup would cost an allocation each time.
-using Tables = std::map<std::wstring, ZyrTextResources::Table, std::less<>>;
+using Tables = std::map<std::wstring, std::map<unsigned int, ZyrRmCString>, std::less<>>;
 
 Tables& tables() {
     static Tables registered;
@@ -12,14 +12,17 @@ Tables& tables() {
 } // namespace
 
 void ZyrTextResources::registerTable(const std::wstring& appName, Table table) {
-    tables()[appName] = std::move(table);
+    std::map<unsigned int, ZyrRmCString> texts;
+    for (auto& [id, text] : table)
+        texts.emplace(id, std::move(text));
+    tables()[appName] = std::move(texts);
 }
 
 void ZyrTextResources::unregisterTable(const std::wstring& appName) { tables().erase(appName); }
 
 bool ZyrTextResources::hasTable(const std::wstring& appName) { return tables().count(appName) != 0; }
 
-const std::wstring* ZyrTextResources::find(std::wstring_view appName, unsigned int id) {
+const ZyrRmCString* ZyrTextResources::find(std::wstring_view appName, unsigned int id) {
     auto table = tables().find(appName);
     if (table == tables().end())
         return nullptr;

@@ -2,6 +2,8 @@
 // under its application name, and strings are built from (application, number).
 #pragma once
 
+#include "platform/base/res/ZyrRmCString.h"
+
 #include <map>
 #include <string>
 #include <string_view>
@@ -15,8 +17,9 @@ public:
     static void unregisterTable(const std::wstring& appName);
     static bool hasTable(const std::wstring& appName);
 
-    // The wording, or null when the module or the number is unknown.
-    static const std::wstring* find(std::wstring_view appName, unsigned int id);
+    // The wording, or null when the module or the number is unknown. Copies of it share its
+    // buffer.
+    static const ZyrRmCString* find(std::wstring_view appName, unsigned int id);
 
     // What an unknown text reads as: visible, and naming what is missing.
     static std::wstring placeholder(std::wstring_view appName, unsigned int id);

@@ -85,9 +85,41 @@ TEST(ZyrRmCString, resourceTextsComeFromTheModulesTable) {
     EXPECT_NE(ZyrRmCString(L"NoSuchApp", 100, false).Find(L"NoSuchApp"), -1);
     EXPECT_NE(ZyrRmCString(nullptr, 1, false).Find(L"1"), -1);
 
+    // Lookups share the table's text, and a copy outlives the table it came from.
+    const ZyrRmCString net(L"TestApp80", 100, false);
+    EXPECT_EQ(net.GetString(), ZyrRmCString(L"TestApp80", 100, false).GetString());
     ZyrTextResources::unregisterTable(L"TestApp80");
     EXPECT_FALSE(ZyrTextResources::hasTable(L"TestApp80"));
     EXPECT_NE(ZyrRmCString(L"TestApp80", 100, false), L"Net &area");
+    EXPECT_EQ(net, L"Net &area");
+}
+
+// Copies share one buffer; every way of changing a copy leaves the others as they were.
+TEST(ZyrRmCString, changingACopyLeavesTheOthers) {
+    using Change = void (*)(ZyrRmCString&);
+    const Change changes[] = {
+        [](ZyrRmCString& s) { s += L"!"; },
+        [](ZyrRmCString& s) { s += ZyrRmCString(L"!"); },
+        [](ZyrRmCString& s) { s += L'!'; },
+        [](ZyrRmCString& s) { s.Replace(L"room", L"hall"); },
+        [](ZyrRmCString& s) { s.Format(L"%d", 7); },
+        [](ZyrRmCString& s) { s.FormatMessage(L"%1", L"x"); },
+        [](ZyrRmCString& s) { s.Empty(); },
+        [](ZyrRmCString& s) { s = L"other"; },
+    };
+    for (size_t i = 0; i < std::size(changes); ++i) {
+        const ZyrRmCString original(L"Living room");
+        ZyrRmCString copy = original;
+        EXPECT_EQ(copy.GetString(), original.GetString()) << "a copy shares the text";
+        changes[i](copy);
+        EXPECT_EQ(original, L"Living room") << "change " << i;
+        EXPECT_NE(copy, original) << "change " << i;
+    }
+    ZyrRmCString unchanged(L"Living room");
+    const ZyrRmCString copy = unchanged;
+    EXPECT_EQ(unchanged.Replace(L"kitchen", L"hall"), 0);
+    EXPECT_EQ(unchanged.GetString(), copy.GetString()) << "a replacement without a match copies nothing";
+    EXPECT_EQ(ZyrRmCString().GetString()[0], L'\0');
 }
 
 } // namespace
