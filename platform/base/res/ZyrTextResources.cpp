@@ -9,6 +9,11 @@ Tables& tables() {
     static Tables registered;
     return registered;
 }
+
+std::uint64_t& currentGeneration() {
+    static std::uint64_t generation = 1;
+    return generation;
+}
 } // namespace
 
 void ZyrTextResources::registerTable(const std::wstring& appName, Table table) {
@@ -16,9 +21,15 @@ void ZyrTextResources::registerTable(const std::wstring& appName, Table table) {
     for (auto& [id, text] : table)
         texts.emplace(id, std::move(text));
     tables()[appName] = std::move(texts);
+    ++currentGeneration();
 }
 
-void ZyrTextResources::unregisterTable(const std::wstring& appName) { tables().erase(appName); }
+void ZyrTextResources::unregisterTable(const std::wstring& appName) {
+    tables().erase(appName);
+    ++currentGeneration();
+}
+
+std::uint64_t ZyrTextResources::generation() { return currentGeneration(); }
 
 bool ZyrTextResources::hasTable(const std::wstring& appName) { return tables().count(appName) != 0; }
 

@@ -4,6 +4,7 @@
 
 #include "platform/base/res/ZyrRmCString.h"
 
+#include <cstdint>
 #include <map>
 #include <string>
 #include <string_view>
@@ -20,6 +21,10 @@ public:
     // The wording, or null when the module or the number is unknown. Copies of it share its
     // buffer.
     static const ZyrRmCString* find(std::wstring_view appName, unsigned int id);
+
+    // Changes with every registration and removal of a table, never to zero: a text kept from
+    // an earlier generation may have changed.
+    static std::uint64_t generation();
 
     // What an unknown text reads as: visible, and naming what is missing.
     static std::wstring placeholder(std::wstring_view appName, unsigned int id);

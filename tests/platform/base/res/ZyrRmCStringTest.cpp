@@ -1,4 +1,5 @@
 // The system string: formatting, case-insensitive comparison, searching, and resource texts.
+#include "platform/base/res/ZyrResourceText.h"
 #include "platform/base/res/ZyrRmCString.h"
 #include "platform/base/res/ZyrTextResources.h"
 
@@ -92,6 +93,19 @@ TEST(ZyrRmCString, resourceTextsComeFromTheModulesTable) {
     EXPECT_FALSE(ZyrTextResources::hasTable(L"TestApp80"));
     EXPECT_NE(ZyrRmCString(L"TestApp80", 100, false), L"Net &area");
     EXPECT_EQ(net, L"Net &area");
+}
+
+// A kept text follows its table: registered anew, removed, or never there.
+TEST(ZyrRmCString, aKeptResourceTextFollowsItsTable) {
+    const ZyrResourceText kept(L"TestApp81", 7);
+    EXPECT_NE(kept.text().Find(L"missing"), -1);
+    ZyrTextResources::registerTable(L"TestApp81", {{7, L"Gross area"}});
+    EXPECT_EQ(kept.text(), L"Gross area");
+    EXPECT_EQ(kept.text().GetString(), ZyrRmCString(L"TestApp81", 7, false).GetString());
+    ZyrTextResources::registerTable(L"TestApp81", {{7, L"Bruttofl\u00e4che"}});
+    EXPECT_EQ(kept.text(), L"Bruttofl\u00e4che");
+    ZyrTextResources::unregisterTable(L"TestApp81");
+    EXPECT_EQ(kept.text(), ZyrRmCString(L"TestApp81", 7, false));
 }
 
 // Copies share one buffer; every way of changing a copy leaves the others as they were.
