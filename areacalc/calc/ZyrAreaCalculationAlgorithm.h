@@ -3,6 +3,7 @@
 #pragma once
 
 #include "areacalc/module/ZyrAreaCalculationClassRegistration.h"
+#include "platform/base/res/ZyrResourceText.h"
 #include "platform/base/res/ZyrRmCString.h"
 #include "platform/host/rx/HsRxObject.h"
 
@@ -31,4 +32,19 @@ public:
     static void getAvailableAlgorithm(std::vector<HsRxClass*>& classes);
     // One summary row per class, by its display name, under the title of the algorithm list.
     static void summaryAlgorithms(ZyrDesc* summary, const std::vector<HsRxClass*>& classes);
+
+    // A new record of the entity with both values zero, keyed by className. Its texts are shared
+    // with every other record of the algorithm.
+    static ZyrCalculationNodeData* newNodeData(const HsDbEntity* entity,
+                                               const ZyrRmCString& className,
+                                               const ZyrResourceText& grossName,
+                                               const ZyrResourceText& netName);
+
+protected:
+    // The name of the algorithm's class, made once: every record of the algorithm carries it.
+    const ZyrRmCString& className() const;
+
+private:
+    // Filled on first use, on the main thread like every calculation.
+    mutable ZyrRmCString m_className;
 };

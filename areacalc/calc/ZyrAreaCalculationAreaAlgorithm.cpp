@@ -19,20 +19,6 @@ ZYR_AREACALC_DEFINE_MEMBERS(ZyrAreaCalculationAreaAlgorithm, ZyrAreaCalculationA
                             hsrxInstantiateClass<ZyrAreaCalculationAreaAlgorithm>, kDisplayNameText,
                             kClassTableText)
 
-namespace {
-
-// A record of the area algorithm with both values zero.
-ZyrCalculationNodeData* newAreaRecord(const HsDbEntity* entity) {
-    auto* data = new ZyrCalculationNodeData;
-    data->algorithmClassName = ZyrAreaCalculationAreaAlgorithm::desc()->name();
-    data->grossName = ZyrAreaCalculationBaseApp::sStringFromResource(kGrossNameText, false);
-    data->netName = ZyrAreaCalculationBaseApp::sStringFromResource(kNetNameText, false);
-    data->objectId = entity->objectId();
-    return data;
-}
-
-} // namespace
-
 ZyrAreaCalculationAreaAlgorithm::ZyrAreaCalculationAreaAlgorithm()
     : m_imp(new ZyrAreaCalculationAreaAlgorithmImp) {}
 
@@ -63,7 +49,17 @@ ZyrCalculationNodeData* ZyrAreaCalculationAreaAlgorithm::areaGroupNodeData(
     return m_imp->areaGroupNodeData(entity, creator);
 }
 
+ZyrAreaCalculationAreaAlgorithmImp::ZyrAreaCalculationAreaAlgorithmImp()
+    : m_className(ZyrAreaCalculationAreaAlgorithm::desc()->name()),
+      m_grossName(ZyrAreaCalculationBaseApp::kAppName, kGrossNameText),
+      m_netName(ZyrAreaCalculationBaseApp::kAppName, kNetNameText) {}
+
 ZyrAreaCalculationAreaAlgorithmImp::~ZyrAreaCalculationAreaAlgorithmImp() = default;
+
+ZyrCalculationNodeData*
+ZyrAreaCalculationAreaAlgorithmImp::newAreaRecord(const HsDbEntity* entity) const {
+    return ZyrAreaCalculationAlgorithm::newNodeData(entity, m_className, m_grossName, m_netName);
+}
 
 ZyrCalculationNodeData*
 ZyrAreaCalculationAreaAlgorithmImp::areaNodeData(HsDbEntity* entity,

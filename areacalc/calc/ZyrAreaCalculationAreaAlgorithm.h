@@ -36,7 +36,7 @@ private:
 // into pieces.
 class ZyrAreaCalculationAreaAlgorithmImp {
 public:
-    ZyrAreaCalculationAreaAlgorithmImp() = default;
+    ZyrAreaCalculationAreaAlgorithmImp();
     ZyrAreaCalculationAreaAlgorithmImp(const ZyrAreaCalculationAreaAlgorithmImp&) = delete;
     ZyrAreaCalculationAreaAlgorithmImp&
     operator=(const ZyrAreaCalculationAreaAlgorithmImp&) = delete;
@@ -50,4 +50,13 @@ public:
     // class nor the creator is looked at.
     ZyrCalculationNodeData* areaGroupNodeData(HsDbEntity* entity,
                                               const ZyrAreaCalculationBitmapCreator* creator) const;
+
+private:
+    // A record with both values zero.
+    ZyrCalculationNodeData* newAreaRecord(const HsDbEntity* entity) const;
+
+    // The records name the area algorithm's own class, whatever class derives from it.
+    const ZyrRmCString m_className;
+    ZyrResourceText m_grossName;
+    ZyrResourceText m_netName;
 };

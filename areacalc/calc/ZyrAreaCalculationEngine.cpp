@@ -290,12 +290,19 @@ ZyrCalculationNodeData* ZyrAreaCalculationEngine::connectNodeDataToCalculationNo
     return data;
 }
 
+const ZyrRmCString& ZyrAreaCalculationEngine::className(const HsRxClass* cls) {
+    for (const auto& [known, name] : classNames)
+        if (known == cls)
+            return name;
+    return classNames.emplace_back(cls, cls->name()).second;
+}
+
 ZyrCalculationNodeHeader* ZyrAreaCalculationEngine::areaNodeHeader(HsDbEntity* entity) {
     auto* header = new ZyrCalculationNodeHeader;
     const ZyrDbArea* area = ZyrDbArea::cast(entity);
     if (area == nullptr)
         return header;
-    header->className = entity->isA()->name();
+    header->className = className(entity->isA());
     header->objectId = entity->objectId();
     header->name = area->name();
     // An area keeps no description of its own: its header's stays empty.
@@ -309,7 +316,7 @@ ZyrCalculationNodeHeader* ZyrAreaCalculationEngine::areaGroupNodeHeader(HsDbEnti
     const ZyrDbAreaGroup* group = ZyrDbAreaGroup::cast(entity);
     if (group == nullptr)
         return header;
-    header->className = entity->isA()->name();
+    header->className = className(entity->isA());
     header->objectId = entity->objectId();
     header->name = group->name();
     // A group keeps no description of its own: its header's stays empty.
@@ -368,8 +375,10 @@ void ZyrAreaCalculationEngine::handleModifiers(const ZyrDbEntity* entity,
         return;
     double value = data->netValue;
     double after = value;
-    std::wstring valueName;
-    ZyrDbAreaModifier::getHardCodedValueName(valueName);
+    std::wstring hardCodedName;
+    ZyrDbAreaModifier::getHardCodedValueName(hardCodedName);
+    // One text shared by the names of every step.
+    const ZyrRmCString valueName(std::move(hardCodedName));
     for (int index : indices) {
         const ZyrModifierData* record = stream->modifierDataVector()[static_cast<size_t>(index)];
         const auto found = modifiers.find(record->objectId);

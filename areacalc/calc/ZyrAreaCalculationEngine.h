@@ -81,6 +81,8 @@ private:
                                                              ZyrAreaCalculationAlgorithm* algorithm,
                                                              NodeDataMaker maker,
                                                              ZyrCalculationNode* node);
+    // The name of a class of pushed objects, made once per class and shared by their headers.
+    const ZyrRmCString& className(const HsRxClass* cls);
     ZyrCalculationNodeHeader* areaNodeHeader(HsDbEntity* entity);
     ZyrCalculationNodeHeader* areaGroupNodeHeader(HsDbEntity* entity);
     void handleGroupChilds(const std::vector<HsDbObjectId>& ids, PushFunction push,
@@ -111,6 +113,8 @@ private:
     PostfixCallback postfixCallback = nullptr;
     void* postfixCallbackData = nullptr;
     std::map<const HsRxClass*, PushFunction> pushFunctions;
+    // The few classes of the objects pushed so far, with their names.
+    std::vector<std::pair<const HsRxClass*, ZyrRmCString>> classNames;
     // The groups from the root down to the one being pushed.
     std::unordered_set<HsDbObjectId> groupsOnPath;
 };

@@ -19,6 +19,10 @@ ZYR_AREACALC_DEFINE_MEMBERS(ZyrAreaCalculationPerimeterAlgorithm, ZyrAreaCalcula
                             hsrxInstantiateClass<ZyrAreaCalculationPerimeterAlgorithm>,
                             kDisplayNameText, kClassTableText)
 
+ZyrAreaCalculationPerimeterAlgorithm::ZyrAreaCalculationPerimeterAlgorithm()
+    : m_grossName(ZyrAreaCalculationBaseApp::kAppName, kGrossNameText),
+      m_netName(ZyrAreaCalculationBaseApp::kAppName, kNetNameText) {}
+
 void ZyrAreaCalculationPerimeterAlgorithm::displayName(ZyrRmCString& name) const {
     ZyrAreaCalculationBaseApp::sStringFromResource(kDisplayNameText, name, false);
 }
@@ -31,12 +35,7 @@ ZyrRmCString ZyrAreaCalculationPerimeterAlgorithm::description() const {
 // names its own class whatever derives from it.
 ZyrCalculationNodeData*
 ZyrAreaCalculationPerimeterAlgorithm::newRecord(const HsDbEntity* entity) const {
-    auto* data = new ZyrCalculationNodeData;
-    data->algorithmClassName = isA()->name();
-    data->grossName = ZyrAreaCalculationBaseApp::sStringFromResource(kGrossNameText, false);
-    data->netName = ZyrAreaCalculationBaseApp::sStringFromResource(kNetNameText, false);
-    data->objectId = entity->objectId();
-    return data;
+    return newNodeData(entity, className(), m_grossName, m_netName);
 }
 
 ZyrCalculationNodeData*

@@ -7,6 +7,8 @@ class ZyrAreaCalculationPerimeterAlgorithm : public ZyrAreaCalculationAlgorithm 
     ZYR_AREACALC_DECLARE_MEMBERS(ZyrAreaCalculationPerimeterAlgorithm)
 
 public:
+    ZyrAreaCalculationPerimeterAlgorithm();
+
     void displayName(ZyrRmCString& name) const override;
     // The bitmap creator is not used.
     ZyrCalculationNodeData*
@@ -20,4 +22,7 @@ public:
 
 private:
     ZyrCalculationNodeData* newRecord(const HsDbEntity* entity) const;
+
+    ZyrResourceText m_grossName;
+    ZyrResourceText m_netName;
 };
