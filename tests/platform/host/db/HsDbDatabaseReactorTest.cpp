@@ -1,8 +1,6 @@
 // Database reactors: told of objects that enter a database (added, loaded, handed over), of a
 // drawing that is dropped, and of the database's end; safe to remove while being told.
 #include "platform/host/db/HsDbDatabaseReactor.h"
-#include "platform/host/db/HsDbDatabase.h"
-#include "platform/host/rx/HsRxClass.h"
 #include "platform/host/ut/HsutUtf8.h"
 #include "tests/platform/host/db/HsDbTestGadget.h"
 
@@ -17,6 +15,7 @@
 namespace {
 
 namespace fs = std::filesystem;
+using Log = std::vector<std::string>;
 
 // Logs what it is told: "appended TestGadget 5 label=...", "cleared", "goodbye".
 class Recorder : public HsDbDatabaseReactor {
@@ -32,7 +31,7 @@ public:
     void databaseCleared(HsDbDatabase*) override { log.push_back("cleared"); }
     void goodbye(HsDbDatabase*) override { log.push_back("goodbye"); }
 
-    std::vector<std::string> log;
+    Log log;
 };
 
 // Takes itself and a victim out at the first thing it is told.
@@ -46,102 +45,71 @@ public:
     Recorder* victim = nullptr;
 };
 
-class HsDbDatabaseReactorTest : public testing::Test {
-protected:
-    void TearDown() override {
-        std::error_code ignored;
-        fs::remove(path, ignored);
-    }
+std::string appended(std::uint64_t handle, const std::string& rest) {
+    return "appended TestGadget " + std::to_string(handle) + " label=" + rest;
+}
 
-    // A drawing of one gadget labelled "saved", as file.
-    std::wstring savedDrawing(std::uint64_t& handle) {
-        HsDbDatabase source;
-        auto* gadget = new TestGadget;
-        gadget->label = L"saved";
-        HsDbObjectId id;
-        EXPECT_EQ(source.addHsDbObject(id, gadget), Hsys::eSuccess);
-        gadget->close();
-        handle = id.handle();
-        path = fs::temp_directory_path() / ("hsdb-reactor-" + std::to_string(::getpid()) + ".zyrd");
-        const std::wstring file = hsutFromUtf8(path.string());
-        EXPECT_EQ(source.saveAs(file.c_str()), Hsys::eSuccess);
-        return file;
-    }
-
-    fs::path path;
-};
-
-TEST_F(HsDbDatabaseReactorTest, anAddedObjectIsToldAfterItsDefaults) {
+TEST(HsDbDatabaseReactor, anAddedObjectIsToldAfterItsDefaultsAndAHandOverWithTheNewObject) {
     HsDbDatabase database;
     Recorder recorder;
     database.addReactor(&recorder);
     database.addReactor(&recorder);
-    auto* gadget = new TestGadget;
+    auto* old = new TestGadget;
     HsDbObjectId id;
-    ASSERT_EQ(database.addHsDbObject(id, gadget), Hsys::eSuccess);
-    gadget->close();
-    EXPECT_EQ(recorder.log,
-              (std::vector<std::string>{"appended TestGadget " + std::to_string(id.handle()) +
-                                        " label= layer"}))
+    ASSERT_EQ(database.addHsDbObject(id, old), Hsys::eSuccess);
+    EXPECT_EQ(recorder.log, Log{appended(id.handle(), " layer")})
         << "told once, with the current layer already set";
+
+    recorder.log.clear();
+    auto* successor = new TestGadget;
+    successor->label = L"new";
+    ASSERT_EQ(old->handOverTo(successor), Hsys::eSuccess);
+    delete old;
+    successor->close();
+    EXPECT_EQ(recorder.log, Log{appended(id.handle(), "new no layer")});
     database.removeReactor(&recorder);
     database.removeReactor(&recorder);
 }
 
-TEST_F(HsDbDatabaseReactorTest, aLoadedObjectIsToldBeforeItsFieldsAreRead) {
+TEST(HsDbDatabaseReactor, loadedObjectsAreToldBeforeTheirFieldsAndAFailedLoadAsCleared) {
+    const fs::path path =
+        fs::temp_directory_path() / ("hsdb-reactor-" + std::to_string(::getpid()) + ".zyrd");
+    const std::wstring file = hsutFromUtf8(path.string());
     std::uint64_t handle = 0;
-    const std::wstring file = savedDrawing(handle);
+    {
+        HsDbDatabase source;
+        handle = addGadget(source, L"saved").handle();
+        ASSERT_EQ(source.saveAs(file.c_str()), Hsys::eSuccess);
+    }
     HsDbDatabase loaded(HsDb::kEmptyDatabase);
     Recorder recorder;
     loaded.addReactor(&recorder);
     ASSERT_EQ(loaded.readDrawingFile(file.c_str()), Hsys::eSuccess);
-    const std::string gadgetLine =
-        "appended TestGadget " + std::to_string(handle) + " label= no layer";
-    EXPECT_EQ(std::count(recorder.log.begin(), recorder.log.end(), gadgetLine), 1);
+    EXPECT_EQ(std::count(recorder.log.begin(), recorder.log.end(), appended(handle, " no layer")),
+              1);
     EXPECT_EQ(recorder.log.size(), loaded.objectIds().size());
     loaded.removeReactor(&recorder);
-}
 
-TEST_F(HsDbDatabaseReactorTest, aDrawingThatFailsToLoadIsToldAsCleared) {
-    std::uint64_t handle = 0;
-    const std::wstring file = savedDrawing(handle);
     sqlite3* db = nullptr;
     ASSERT_EQ(sqlite3_open(path.c_str(), &db), SQLITE_OK);
     ASSERT_EQ(sqlite3_exec(db, "UPDATE objects SET data = x'0000' WHERE class = 'TestGadget'",
                            nullptr, nullptr, nullptr),
               SQLITE_OK);
     sqlite3_close(db);
-    HsDbDatabase loaded(HsDb::kEmptyDatabase);
-    Recorder recorder;
-    loaded.addReactor(&recorder);
-    EXPECT_EQ(loaded.readDrawingFile(file.c_str()), Hsys::eBadDrawingFile);
+    HsDbDatabase damaged(HsDb::kEmptyDatabase);
+    recorder.log.clear();
+    damaged.addReactor(&recorder);
+    EXPECT_EQ(damaged.readDrawingFile(file.c_str()), Hsys::eBadDrawingFile);
+    fs::remove(path);
     ASSERT_FALSE(recorder.log.empty());
     EXPECT_EQ(recorder.log.back(), "cleared");
     recorder.log.clear();
-    EXPECT_EQ(loaded.readDrawingFile(L"/nonexistent/drawing.zyrd"), Hsys::eFileNotFound);
+    EXPECT_EQ(damaged.readDrawingFile(L"/nonexistent/drawing.zyrd"), Hsys::eFileNotFound);
     EXPECT_TRUE(recorder.log.empty()) << "nothing was there to clear";
-    loaded.removeReactor(&recorder);
+    damaged.removeReactor(&recorder);
 }
 
-TEST_F(HsDbDatabaseReactorTest, aHandOverIsToldWithTheNewObject) {
-    HsDbDatabase database;
-    auto* old = new TestGadget;
-    HsDbObjectId id;
-    ASSERT_EQ(database.addHsDbObject(id, old), Hsys::eSuccess);
-    Recorder recorder;
-    database.addReactor(&recorder);
-    auto* successor = new TestGadget;
-    successor->label = L"new";
-    ASSERT_EQ(old->handOverTo(successor), Hsys::eSuccess);
-    delete old;
-    successor->close();
-    EXPECT_EQ(recorder.log,
-              (std::vector<std::string>{"appended TestGadget " + std::to_string(id.handle()) +
-                                        " label=new no layer"}));
-    database.removeReactor(&recorder);
-}
-
-TEST_F(HsDbDatabaseReactorTest, goodbyeReachesOnlyReactorsStillRegistered) {
+TEST(HsDbDatabaseReactor, goodbyeReachesOnlyReactorsStillRegistered) {
     Recorder victim;
     Remover remover;
     Recorder last;
@@ -152,9 +120,9 @@ TEST_F(HsDbDatabaseReactorTest, goodbyeReachesOnlyReactorsStillRegistered) {
         database.addReactor(&victim);
         database.addReactor(&last);
     }
-    EXPECT_EQ(remover.log, std::vector<std::string>{"goodbye"});
+    EXPECT_EQ(remover.log, Log{"goodbye"});
     EXPECT_TRUE(victim.log.empty());
-    EXPECT_EQ(last.log, std::vector<std::string>{"goodbye"})
+    EXPECT_EQ(last.log, Log{"goodbye"})
         << "and no cleared after it: the database forgets its reactors";
 }
 

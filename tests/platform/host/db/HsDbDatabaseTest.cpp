@@ -1,11 +1,9 @@
 // The database's standard records, dictionaries, symbol tables, units and audit.
 #include "platform/host/db/HsDbDatabase.h"
 #include "platform/host/db/HsDbAuditInfo.h"
-#include "platform/host/db/HsDbBlockTable.h"
 #include "platform/host/db/HsDbDictionary.h"
 #include "platform/host/db/HsDbHostApplicationServices.h"
 #include "platform/host/db/HsDbLayerTable.h"
-#include "platform/host/db/HsDbObjectPointer.h"
 #include "platform/host/db/HsDbTextStyleTable.h"
 #include "platform/host/ut/HsutConsole.h"
 #include "tests/platform/host/db/HsDbTestGadget.h"
@@ -31,11 +29,7 @@ protected:
 };
 
 TEST_F(HsDbDatabaseTest, aNewDrawingHasTheStandardRecords) {
-    struct Case {
-        HsDbObjectId id;
-        HsRxClass* cls;
-    };
-    const Case cases[] = {
+    const std::pair<HsDbObjectId, HsRxClass*> records[] = {
         {db.namedObjectsDictionaryId(), HsDbDictionary::desc()},
         {db.blockTableId(), HsDbBlockTable::desc()},
         {db.layerTableId(), HsDbLayerTable::desc()},
@@ -44,25 +38,19 @@ TEST_F(HsDbDatabaseTest, aNewDrawingHasTheStandardRecords) {
         {db.currentLayerId(), HsDbLayerTableRecord::desc()},
         {db.currentTextStyleId(), HsDbTextStyleTableRecord::desc()},
     };
-    for (const Case& c : cases)
-        EXPECT_EQ(c.id.objectClass(), c.cls) << c.cls->name();
+    for (const auto& [id, cls] : records)
+        EXPECT_EQ(id.objectClass(), cls) << cls->name();
 
-    HsDbObjectPointer<HsDbBlockTable> blocks(db.blockTableId(), HsDb::kForRead);
     HsDbObjectId found;
-    EXPECT_EQ(blocks->getAt(L"*MODEL_SPACE", found), Hsys::eSuccess);
+    EXPECT_EQ(HsDbObjectPointer<HsDbBlockTable>(db.blockTableId(), HsDb::kForRead)
+                  ->getAt(L"*MODEL_SPACE", found),
+              Hsys::eSuccess);
     EXPECT_EQ(found, db.modelSpaceId());
     HsDbObjectPointer<HsDbTextStyleTableRecord> standard(db.currentTextStyleId(), HsDb::kForRead);
     EXPECT_EQ(standard->name(), L"Standard");
     EXPECT_EQ(standard->textSize(), 2.5);
     EXPECT_EQ(standard->ownerId(), db.textStyleTableId());
-    EXPECT_TRUE(db.xrefBlockId().isNull());
-    const wchar_t* fileName = nullptr;
-    db.getFilename(fileName);
-    EXPECT_STREQ(fileName, L"");
-
-    HsDbDatabase empty(HsDb::kEmptyDatabase);
-    EXPECT_TRUE(empty.objectIds().empty());
-    EXPECT_TRUE(empty.modelSpaceId().isNull());
+    EXPECT_TRUE(HsDbDatabase(HsDb::kEmptyDatabase).objectIds().empty());
 }
 
 TEST_F(HsDbDatabaseTest, dictionariesNestAndFindNamesWithoutRegardToCase) {
@@ -81,7 +69,6 @@ TEST_F(HsDbDatabaseTest, dictionariesNestAndFindNamesWithoutRegardToCase) {
     EXPECT_EQ(dictionary->setAt(L"STANDARD", &refused, id), Hsys::eDuplicateName);
     EXPECT_TRUE(refused.objectId().isNull());
     EXPECT_EQ(dictionary->setAt(L"", nullptr, id), Hsys::eBadArgument);
-    EXPECT_EQ(standard.objectClass(), TestGadget::desc());
 
     EXPECT_EQ(dictionary->setName(L"standard", L"B\u00fcro"), Hsys::eDuplicateName);
     EXPECT_EQ(dictionary->setName(L"standard", L"Normal"), Hsys::eSuccess);
@@ -91,10 +78,7 @@ TEST_F(HsDbDatabaseTest, dictionariesNestAndFindNamesWithoutRegardToCase) {
     EXPECT_EQ(dictionary->entries(), (std::vector<std::pair<std::wstring, HsDbObjectId>>{
                                          {L"B\u00fcro", office}, {L"Normal", standard}}));
 
-    {
-        HsDbObjectPointer<HsDbObject> erased(office, HsDb::kForWrite);
-        ASSERT_EQ(erased->erase(), Hsys::eSuccess);
-    }
+    ASSERT_EQ(HsDbObjectPointer<HsDbObject>(office, HsDb::kForWrite)->erase(), Hsys::eSuccess);
     EXPECT_FALSE(dictionary->has(L"B\u00fcro")) << "an erased entry is hidden";
     EXPECT_EQ(dictionary->numEntries(), 1);
     EXPECT_EQ(dictionary->remove(L"normal", id), Hsys::eSuccess);
@@ -135,10 +119,8 @@ TEST_F(HsDbDatabaseTest, symbolTablesKeepNamesUniqueAndRecordsOfTheirKind) {
 
 TEST_F(HsDbDatabaseTest, valuesConvertIntoTheDisplayUnits) {
     struct Case {
-        HsDb::UnitsValue drawing;
-        HsDb::UnitsValue display;
-        double length;
-        double area;
+        HsDb::UnitsValue drawing, display;
+        double length, area;
     };
     const Case cases[] = {
         {HsDb::kUnitsMillimeters, HsDb::kUnitsMeters, 0.001, 1e-6},
@@ -149,12 +131,11 @@ TEST_F(HsDbDatabaseTest, valuesConvertIntoTheDisplayUnits) {
         {HsDb::kUnitsKilometers, HsDb::kUnitsUnitless, 1.0, 1.0},
     };
     for (const Case& c : cases) {
+        SCOPED_TRACE(std::string(HsDb::toString(c.drawing)) + " to " + HsDb::toString(c.display));
         db.setDrawingUnits(c.drawing);
         db.setDisplayUnits(c.display);
-        EXPECT_NEAR(db.lengthInDisplayUnits(1.0), c.length, c.length * 1e-12)
-            << HsDb::toString(c.drawing) << " to " << HsDb::toString(c.display);
-        EXPECT_NEAR(db.areaInDisplayUnits(1.0), c.area, c.area * 1e-12)
-            << HsDb::toString(c.drawing) << " to " << HsDb::toString(c.display);
+        EXPECT_NEAR(db.lengthInDisplayUnits(1.0), c.length, c.length * 1e-12);
+        EXPECT_NEAR(db.areaInDisplayUnits(1.0), c.area, c.area * 1e-12);
     }
     EXPECT_EQ(db.setDisplayPrecision(9), Hsys::eBadArgument);
     EXPECT_EQ(db.displayPrecision(), 2);
@@ -173,16 +154,12 @@ TEST_F(HsDbDatabaseTest, theWorkingDatabaseIsForgottenWhenItIsDestroyed) {
 TEST_F(HsDbDatabaseTest, anAuditReportsDanglingReferencesAndFixesThemWhenAllowed) {
     HsDbObjectId ghost;
     ASSERT_EQ(db.getHsDbObjectId(ghost, true, 5000), Hsys::eSuccess);
-    const HsDbObjectId named = db.namedObjectsDictionaryId();
-    HsDbObjectId gadgetId;
     {
-        auto* gadget = new TestGadget;
-        HsDbObjectPointer<HsDbObject> added(gadget);
-        ASSERT_EQ(db.addHsDbObject(gadgetId, gadget), Hsys::eSuccess);
+        HsDbObjectPointer<TestGadget> gadget(addGadget(db), HsDb::kForWrite);
         gadget->setOwnerId(ghost);
-        ASSERT_EQ(gadget->setLayer(db.currentLayerId()), Hsys::eSuccess);
         // A dictionary as a damaged drawing could hold it: its one entry names a lost handle.
-        HsDbObjectPointer<HsDbDictionary> dictionary(named, HsDb::kForWrite);
+        HsDbObjectPointer<HsDbDictionary> dictionary(db.namedObjectsDictionaryId(),
+                                                     HsDb::kForWrite);
         HsDbBdfFiler edited(&db);
         edited.writeSoftPointerId(HsDbObjectId());
         edited.writeUInt32(1);

@@ -21,25 +21,22 @@ void drawRoom(HsDbPolyline& polyline) {
     polyline.addVertexAt(1, {2.0, -1.0});
 }
 
+std::vector<HsGePoint3d> pointsOf(const HsDbPolyline& polyline) {
+    std::vector<HsGePoint3d> points(polyline.numVerts());
+    for (unsigned int i = 0; i < points.size(); ++i)
+        EXPECT_EQ(polyline.getPointAt(i, points[i]), Hsys::eSuccess);
+    return points;
+}
+
 TEST(HsDbPolyline, verticesGoWhereTheIndexSays) {
     HsDbPolyline polyline;
     drawRoom(polyline);
-    ASSERT_EQ(polyline.numVerts(), 4u);
-    const double xs[] = {0.0, 2.0, 4.0, 4.0};
-    for (unsigned int i = 0; i < 4; ++i) {
-        HsGePoint2d point;
-        ASSERT_EQ(polyline.getPointAt(i, point), Hsys::eSuccess);
-        EXPECT_EQ(point.x, xs[i]) << "vertex " << i;
-    }
-    double bulge = 0.0;
-    double start = 0.0;
-    double end = 0.0;
-    EXPECT_EQ(polyline.getBulgeAt(2, bulge), Hsys::eSuccess);
-    EXPECT_EQ(bulge, 1.0);
-    EXPECT_EQ(polyline.getWidthsAt(3, start, end), Hsys::eSuccess);
-    EXPECT_EQ(start, 0.2);
-    EXPECT_EQ(end, 0.4);
-
+    EXPECT_EQ(pointsOf(polyline),
+              (std::vector<HsGePoint3d>{
+                  {0.0, 0.0, 0.0}, {2.0, -1.0, 0.0}, {4.0, 0.0, 0.0}, {4.0, 3.0, 0.0}}));
+    double widths[2] = {};
+    EXPECT_EQ(polyline.getWidthsAt(3, widths[0], widths[1]), Hsys::eSuccess);
+    EXPECT_EQ(widths[1], 0.4);
     HsGePoint2d untouched{9.0, 9.0};
     EXPECT_EQ(polyline.getPointAt(4, untouched), Hsys::eInvalidIndex);
     EXPECT_EQ(untouched.x, 9.0);
@@ -48,11 +45,9 @@ TEST(HsDbPolyline, verticesGoWhereTheIndexSays) {
               Hsys::eBadArgument);
     EXPECT_EQ(polyline.removeVertexAt(1), Hsys::eSuccess);
     EXPECT_EQ(polyline.numVerts(), 3u);
-    EXPECT_TRUE(polyline.isClosed());
-    EXPECT_TRUE(polyline.hasPlinegen());
 }
 
-TEST(HsDbPolyline, movesThatKeepCirclesCarryEveryVertexAndScaleTheWidths) {
+TEST(HsDbPolyline, movesThatKeepCirclesCarryEveryVertexAndOthersChangeNothing) {
     const HsGeMatrix3d turnAndShift =
         HsGeMatrix3d::translation({10.0, 20.0, 5.0}) *
         HsGeMatrix3d::rotation(std::numbers::pi / 2, HsGeVector3d::kZAxis);
@@ -60,48 +55,37 @@ TEST(HsDbPolyline, movesThatKeepCirclesCarryEveryVertexAndScaleTheWidths) {
         const char* what;
         HsGeMatrix3d xform;
         double widthFactor;
+        bool refused;
     };
     const Case cases[] = {
-        {"turn and shift", turnAndShift, 1.0},
-        {"uniform scale", HsGeMatrix3d::scaling(2.5, {1.0, 1.0, 0.0}), 2.5},
-        {"mirror", HsGeMatrix3d::scaling(-1.0, 1.0, 1.0), 1.0},
-        {"tilt into another plane", HsGeMatrix3d::rotation(0.3, HsGeVector3d::kXAxis), 1.0},
+        {"turn and shift", turnAndShift, 1.0, false},
+        {"uniform scale", HsGeMatrix3d::scaling(2.5, {1.0, 1.0, 0.0}), 2.5, false},
+        {"mirror", HsGeMatrix3d::scaling(-1.0, 1.0, 1.0), 1.0, false},
+        {"tilt into another plane", HsGeMatrix3d::rotation(0.3, HsGeVector3d::kXAxis), 1.0, false},
+        {"stretch would bend arcs", HsGeMatrix3d::scaling(2.0, 1.0, 1.0), 1.0, true},
+        {"flatten", HsGeMatrix3d::scaling(0.0), 1.0, true},
     };
     HsDbPolyline original;
     drawRoom(original);
     for (const Case& c : cases) {
+        SCOPED_TRACE(c.what);
         HsDbPolyline polyline;
         drawRoom(polyline);
-        ASSERT_EQ(polyline.transformBy(c.xform), Hsys::eSuccess) << c.what;
-        for (unsigned int i = 0; i < polyline.numVerts(); ++i) {
-            HsGePoint2d before;
-            original.getPointAt(i, before);
-            const HsGePoint3d expected = c.xform * HsGePoint3d(before.x, before.y, 0.0);
-            HsGePoint3d moved;
-            ASSERT_EQ(polyline.getPointAt(i, moved), Hsys::eSuccess);
-            EXPECT_NEAR(moved.distanceTo(expected), 0.0, 1e-12) << c.what << ", vertex " << i;
+        EXPECT_EQ(polyline.transformBy(c.xform), c.refused ? Hsys::eBadArgument : Hsys::eSuccess);
+        const std::vector<HsGePoint3d> moved = pointsOf(polyline);
+        const std::vector<HsGePoint3d> before = pointsOf(original);
+        for (std::size_t i = 0; i < moved.size(); ++i) {
+            const HsGePoint3d expected = c.refused ? before[i] : c.xform * before[i];
+            EXPECT_NEAR(moved[i].distanceTo(expected), 0.0, 1e-12) << "vertex " << i;
         }
         double bulge = 0.0;
         double start = 0.0;
         double end = 0.0;
         polyline.getBulgeAt(2, bulge);
         polyline.getWidthsAt(3, start, end);
-        EXPECT_EQ(bulge, 1.0) << c.what << ": the moved axes carry any mirror";
-        EXPECT_NEAR(start, 0.2 * c.widthFactor, 1e-12) << c.what;
-        EXPECT_NEAR(polyline.xAxis().length(), 1.0, 1e-12) << c.what;
-    }
-}
-
-TEST(HsDbPolyline, aMoveThatWouldBendArcsIsRefusedAndChangesNothing) {
-    HsDbPolyline polyline;
-    drawRoom(polyline);
-    const HsGeMatrix3d refused[] = {HsGeMatrix3d::scaling(2.0, 1.0, 1.0),
-                                    HsGeMatrix3d::scaling(0.0)};
-    for (const HsGeMatrix3d& xform : refused) {
-        EXPECT_EQ(polyline.transformBy(xform), Hsys::eBadArgument);
-        HsGePoint3d point;
-        polyline.getPointAt(2, point);
-        EXPECT_EQ(point.x, 4.0);
+        EXPECT_EQ(bulge, 1.0) << "the moved axes carry any mirror";
+        EXPECT_NEAR(start, 0.2 * c.widthFactor, 1e-12);
+        EXPECT_NEAR(polyline.xAxis().length(), 1.0, 1e-12);
     }
 }
 
@@ -113,24 +97,16 @@ TEST(HsDbPolyline, filesItsPlaneAndVerticesAndRefusesAnImpossiblePlane) {
               Hsys::eSuccess);
     HsDbBdfFiler writer(&db);
     ASSERT_EQ(source.bdfOutFields(&writer), Hsys::eSuccess);
-
     HsDbBdfFiler reader(writer.bytes(), &db);
     HsDbPolyline copy;
     ASSERT_EQ(copy.bdfInFields(&reader), Hsys::eSuccess);
     EXPECT_EQ(reader.remaining(), 0u);
-    ASSERT_EQ(copy.numVerts(), source.numVerts());
-    for (unsigned int i = 0; i < copy.numVerts(); ++i) {
-        HsGePoint3d a;
-        HsGePoint3d b;
-        source.getPointAt(i, a);
-        copy.getPointAt(i, b);
-        EXPECT_EQ(a.distanceTo(b), 0.0) << "vertex " << i;
-    }
+    EXPECT_EQ(pointsOf(copy), pointsOf(source));
     EXPECT_TRUE(copy.isClosed());
+    EXPECT_TRUE(copy.hasPlinegen());
 
     // Owner, layer, two flags and the origin come before the x axis.
     const std::size_t xAxisAt = 8 + 8 + 1 + 1 + 24;
-    const std::size_t countAt = xAxisAt + 48;
     struct Case {
         const char* what;
         std::size_t at;
@@ -139,7 +115,7 @@ TEST(HsDbPolyline, filesItsPlaneAndVerticesAndRefusesAnImpossiblePlane) {
     const Case cases[] = {
         {"an x axis of length 2", xAxisAt, {0, 0, 0, 0, 0, 0, 0, 0x40}},
         {"an x axis of NaN", xAxisAt, {0, 0, 0, 0, 0, 0, 0xF8, 0x7F}},
-        {"more vertices than bytes", countAt, {0xFF, 0xFF, 0, 0}},
+        {"more vertices than bytes", xAxisAt + 48, {0xFF, 0xFF, 0, 0}},
     };
     for (const Case& c : cases) {
         std::vector<std::uint8_t> bytes = writer.bytes();

@@ -1,14 +1,19 @@
 // A persistent entity for tests: one field of every filed type, references to other objects, and
 // a version word that a test can set to what a later version would write. Include it in one
-// source file of a program: it defines the class.
+// source file of a program: it defines the class and the helper that puts one in model space.
 #pragma once
 
+#include "platform/host/db/HsDbBlockTable.h"
+#include "platform/host/db/HsDbDatabase.h"
 #include "platform/host/db/HsDbEntity.h"
+#include "platform/host/db/HsDbObjectPointer.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
 #include "platform/host/filer/HsDbFilerSupport.h"
 #include "platform/host/ge/HsGePoint2d.h"
 #include "platform/host/ge/HsGePoint3d.h"
 #include "platform/host/rx/HsRxClass.h"
+
+#include <gtest/gtest.h>
 
 #include <cstdint>
 #include <string>
@@ -29,10 +34,6 @@ public:
     void setLabel(std::wstring value) {
         assertWriteEnabled();
         label = std::move(value);
-    }
-    void setPartner(const HsDbObjectId& id) {
-        assertWriteEnabled();
-        partner = id;
     }
 
     Hsys::ErrorStatus bdfInFields(HsDbBdfFiler* filer) override {
@@ -100,3 +101,13 @@ public:
 };
 
 HSRX_DEFINE_MEMBERS(TestGadget, HsDbEntity, 0, hsrxInstantiateClass<TestGadget>)
+
+// A gadget with a label appended to model space and closed, as the plan's next room.
+inline HsDbObjectId addGadget(HsDbDatabase& db, const wchar_t* label = L"") {
+    HsDbObjectPointer<HsDbBlockTableRecord> space(db.modelSpaceId(), HsDb::kForWrite);
+    HsDbObjectPointer<TestGadget> gadget(new TestGadget);
+    gadget->label = label;
+    HsDbObjectId id;
+    EXPECT_EQ(space->appendHsDbEntity(id, gadget.object()), Hsys::eSuccess);
+    return id;
+}

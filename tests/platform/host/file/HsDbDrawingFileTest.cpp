@@ -1,12 +1,8 @@
 // Drawing files: a database saved and read back whole, proxies written back byte for byte,
 // damaged and foreign files refused with nothing left behind, and saves that are atomic.
 #include "platform/host/file/HsDbDrawingFile.h"
-#include "platform/host/db/HsDbBlockTable.h"
-#include "platform/host/db/HsDbDatabase.h"
 #include "platform/host/db/HsDbDictionary.h"
-#include "platform/host/db/HsDbObjectPointer.h"
 #include "platform/host/db/HsDbProxyObject.h"
-#include "platform/host/db/HsDbTextStyleTable.h"
 #include "tests/platform/host/db/HsDbTestGadget.h"
 
 #include <gtest/gtest.h>
@@ -43,10 +39,11 @@ std::map<std::int64_t, std::pair<std::string, Bytes>> rowsOf(const fs::path& pat
     return rows;
 }
 
-void executeSql(const fs::path& path, const char* sql) {
+void executeSql(const fs::path& path, const std::string& sql) {
     sqlite3* db = nullptr;
     ASSERT_EQ(sqlite3_open(path.c_str(), &db), SQLITE_OK);
-    EXPECT_EQ(sqlite3_exec(db, sql, nullptr, nullptr, nullptr), SQLITE_OK) << sqlite3_errmsg(db);
+    EXPECT_EQ(sqlite3_exec(db, sql.c_str(), nullptr, nullptr, nullptr), SQLITE_OK)
+        << sqlite3_errmsg(db);
     sqlite3_close(db);
 }
 
@@ -62,17 +59,6 @@ protected:
     }
     void TearDown() override { fs::remove_all(directory); }
 
-    // A gadget in model space, with a label, as the plan's next room.
-    HsDbObjectId addGadget(HsDbDatabase& db, const wchar_t* label) {
-        HsDbObjectPointer<HsDbBlockTableRecord> space(db.modelSpaceId(), HsDb::kForWrite);
-        auto* gadget = new TestGadget;
-        gadget->label = label;
-        HsDbObjectId id;
-        EXPECT_EQ(space->appendHsDbEntity(id, gadget), Hsys::eSuccess);
-        gadget->close();
-        return id;
-    }
-
     Hsys::ErrorStatus save(HsDbDatabase& db) { return db.saveAs(path.wstring().c_str()); }
     Hsys::ErrorStatus load(HsDbDatabase& db, std::wstring* reason = nullptr) {
         return db.readDrawingFile(path.wstring().c_str(), reason);
@@ -82,7 +68,9 @@ protected:
     fs::path path;
 };
 
-TEST_F(HsDbDrawingFileTest, aSavedDatabaseLoadsWithTheSameObjectsFieldsAndReferences) {
+// What the bytes cannot show: ids that resolve into the loaded database, erasures, the header.
+// That every object reads and writes back its bytes is shown by the resave below.
+TEST_F(HsDbDrawingFileTest, aSavedDatabaseLoadsWithTheSameObjectsAndReferences) {
     HsDbDatabase original;
     original.setDrawingUnits(HsDb::kUnitsCentimeters);
     ASSERT_EQ(original.setDisplayPrecision(3), Hsys::eSuccess);
@@ -93,20 +81,7 @@ TEST_F(HsDbDrawingFileTest, aSavedDatabaseLoadsWithTheSameObjectsFieldsAndRefere
         HsDbObjectPointer<TestGadget> gadget(kitchen, HsDb::kForWrite);
         gadget->partner = hall;
         gadget->neighbours = {hall, storeroom, HsDbObjectId()};
-        gadget->names = {L"EG", L"Nord"};
-        gadget->length = 12.25;
-        HsDbObjectPointer<TestGadget> erased(storeroom, HsDb::kForWrite);
-        ASSERT_EQ(erased->erase(), Hsys::eSuccess);
-    }
-    HsDbObjectId styles;
-    HsDbObjectId standardStyle;
-    {
-        HsDbObjectPointer<HsDbDictionary> named(original.namedObjectsDictionaryId(),
-                                                HsDb::kForWrite);
-        HsDbObjectPointer<HsDbDictionary> sub(new HsDbDictionary);
-        ASSERT_EQ(named->setAt(L"ZYR_AREA_STYLES", sub.object(), styles), Hsys::eSuccess);
-        HsDbObjectPointer<TestGadget> record(new TestGadget);
-        ASSERT_EQ(sub->setAt(L"Standard", record.object(), standardStyle), Hsys::eSuccess);
+        HsDbObjectPointer<TestGadget>(storeroom, HsDb::kForWrite)->erase();
     }
     ASSERT_EQ(save(original), Hsys::eSuccess);
 
@@ -118,9 +93,6 @@ TEST_F(HsDbDrawingFileTest, aSavedDatabaseLoadsWithTheSameObjectsFieldsAndRefere
     EXPECT_EQ(fs::path(fileName), path);
     EXPECT_EQ(loaded.drawingUnits(), HsDb::kUnitsCentimeters);
     EXPECT_EQ(loaded.displayPrecision(), 3);
-    EXPECT_EQ(loaded.modelSpaceId().handle(), original.modelSpaceId().handle());
-    EXPECT_EQ(loaded.currentLayerId().handle(), original.currentLayerId().handle());
-
     auto sameIn = [&loaded](const HsDbObjectId& id) {
         HsDbObjectId found;
         EXPECT_EQ(loaded.getHsDbObjectId(found, false, id.handle()), Hsys::eSuccess);
@@ -131,66 +103,37 @@ TEST_F(HsDbDrawingFileTest, aSavedDatabaseLoadsWithTheSameObjectsFieldsAndRefere
     EXPECT_EQ(space->entityIds(),
               (std::vector<HsDbObjectId>{sameIn(kitchen), sameIn(hall), sameIn(storeroom)}));
     EXPECT_TRUE(sameIn(storeroom).isErased());
-
     HsDbObjectPointer<TestGadget> gadget(sameIn(kitchen), HsDb::kForRead);
     ASSERT_EQ(gadget.openStatus(), Hsys::eSuccess);
-    EXPECT_EQ(gadget->label, L"K\u00fcche");
-    EXPECT_EQ(gadget->length, 12.25);
-    EXPECT_EQ(gadget->names, (std::vector<std::wstring>{L"EG", L"Nord"}));
     EXPECT_EQ(gadget->partner, sameIn(hall));
-    EXPECT_EQ(gadget->partner.database(), &loaded);
     EXPECT_EQ(gadget->neighbours,
               (std::vector<HsDbObjectId>{sameIn(hall), sameIn(storeroom), HsDbObjectId()}));
-    EXPECT_EQ(gadget->ownerId(), loaded.modelSpaceId());
     EXPECT_EQ(gadget->layerId(), loaded.currentLayerId());
-
-    HsDbObjectPointer<HsDbDictionary> named(loaded.namedObjectsDictionaryId(), HsDb::kForRead);
-    HsDbObjectId loadedStyles;
-    ASSERT_EQ(named->getAt(L"zyr_area_styles", loadedStyles), Hsys::eSuccess);
-    HsDbObjectPointer<HsDbDictionary> sub(loadedStyles, HsDb::kForRead);
-    HsDbObjectId loadedStandard;
-    ASSERT_EQ(sub->getAt(L"STANDARD", loadedStandard), Hsys::eSuccess);
-    EXPECT_EQ(loadedStandard, sameIn(standardStyle));
-    EXPECT_EQ(loadedStandard.objectClass(), TestGadget::desc());
 
     HsDbObjectId added;
     ASSERT_EQ(loaded.addHsDbObject(added, new TestGadget), Hsys::eSuccess);
-    EXPECT_GT(added.handle(), standardStyle.handle()) << "new handles never reuse loaded ones";
+    EXPECT_GT(added.handle(), storeroom.handle()) << "new handles never reuse loaded ones";
     HsDbObjectPointer<HsDbObject>(added, HsDb::kForRead);
 }
 
 TEST_F(HsDbDrawingFileTest, unknownClassesAndLaterVersionsComeBackByteForByte) {
     HsDbDatabase original;
-    const HsDbObjectId current = addGadget(original, L"heute");
     const HsDbObjectId later = addGadget(original, L"morgen");
     const HsDbObjectId foreign = addGadget(original, L"fremd");
     {
-        HsDbObjectPointer<TestGadget> gadget(current, HsDb::kForWrite);
-        gadget->partner = later;
+        HsDbObjectPointer<HsDbDictionary> named(original.namedObjectsDictionaryId(),
+                                                HsDb::kForWrite);
+        HsDbObjectPointer<HsDbDictionary> styles(new HsDbDictionary);
+        HsDbObjectId id;
+        ASSERT_EQ(named->setAt(L"ZYR_AREA_STYLES", styles.object(), id), Hsys::eSuccess);
     }
-    ASSERT_EQ(save(original), Hsys::eSuccess);
     // Written as a later version would write it, and with a class this build never had.
     TestGadget::versionToWrite = 81;
-    {
-        HsDbObjectPointer<TestGadget> gadget(later, HsDb::kForRead);
-        HsDbBdfFiler filer(&original);
-        ASSERT_EQ(gadget->bdfOut(&filer), Hsys::eSuccess);
-        sqlite3* db = nullptr;
-        ASSERT_EQ(sqlite3_open(path.c_str(), &db), SQLITE_OK);
-        sqlite3_stmt* update = nullptr;
-        sqlite3_prepare_v2(db, "UPDATE objects SET data = ? WHERE handle = ?", -1, &update,
-                           nullptr);
-        sqlite3_bind_blob(update, 1, filer.bytes().data(), static_cast<int>(filer.bytes().size()),
-                          SQLITE_STATIC);
-        sqlite3_bind_int64(update, 2, static_cast<sqlite3_int64>(later.handle()));
-        EXPECT_EQ(sqlite3_step(update), SQLITE_DONE);
-        sqlite3_finalize(update);
-        sqlite3_close(db);
-    }
+    const Hsys::ErrorStatus saved = save(original);
     TestGadget::versionToWrite = TestGadget::kCurrentVersion;
-    executeSql(path, ("UPDATE objects SET class = 'ZyrDbFromTheFuture' WHERE handle = " +
-                      std::to_string(foreign.handle()))
-                         .c_str());
+    ASSERT_EQ(saved, Hsys::eSuccess);
+    executeSql(path, "UPDATE objects SET class = 'ZyrDbFromTheFuture' WHERE handle = " +
+                         std::to_string(foreign.handle()));
     const auto before = rowsOf(path);
 
     HsDbDatabase loaded(HsDb::kEmptyDatabase);
@@ -200,16 +143,16 @@ TEST_F(HsDbDrawingFileTest, unknownClassesAndLaterVersionsComeBackByteForByte) {
     HsDbObjectId foreignId;
     loaded.getHsDbObjectId(laterId, false, later.handle());
     loaded.getHsDbObjectId(foreignId, false, foreign.handle());
-    EXPECT_EQ(laterId.objectClass(), HsDbProxyObject::desc());
-    EXPECT_EQ(foreignId.objectClass(), HsDbProxyObject::desc());
+    EXPECT_EQ(HsDbObjectPointer<TestGadget>(laterId, HsDb::kForRead).openStatus(),
+              Hsys::eWrongClass);
     {
-        HsDbObjectPointer<HsDbProxyObject> proxy(foreignId, HsDb::kForRead);
+        HsDbObjectPointer<HsDbProxyObject> proxy(laterId, HsDb::kForRead);
+        EXPECT_EQ(proxy.openStatus(), Hsys::eSuccess);
+        proxy.open(foreignId, HsDb::kForRead);
+        ASSERT_EQ(proxy.openStatus(), Hsys::eSuccess);
         EXPECT_EQ(proxy->originalClassName(), L"ZyrDbFromTheFuture");
         EXPECT_EQ(proxy->ownerId(), loaded.modelSpaceId());
-        HsDbObjectPointer<TestGadget> gadget(laterId, HsDb::kForRead);
-        EXPECT_EQ(gadget.openStatus(), Hsys::eWrongClass);
     }
-
     fs::remove(path);
     ASSERT_EQ(save(loaded), Hsys::eSuccess);
     EXPECT_EQ(rowsOf(path), before) << "every row, proxies included, as it was read";
@@ -253,7 +196,7 @@ TEST_F(HsDbDrawingFileTest, damagedAndForeignFilesAreRefusedAndLeaveTheDatabaseE
     };
     for (const Case& c : cases) {
         fs::copy_file(good, path, fs::copy_options::overwrite_existing);
-        executeSql(path, c.sql.c_str());
+        executeSql(path, c.sql);
         HsDbDatabase loaded(HsDb::kEmptyDatabase);
         std::wstring reason;
         EXPECT_EQ(load(loaded, &reason), c.expected) << c.sql;

