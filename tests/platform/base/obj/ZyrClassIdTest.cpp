@@ -10,26 +10,16 @@ namespace {
 TEST(ZyrClassId, idsAreStableDistinctByKindAndRefuseEmptyText) {
     const ZyrRmCString text = Zyr::constructClassID(L"ZyrArea");
     EXPECT_EQ(text, L"Zyr.ZyrArea.ClassId");
-
-    _GUID entity;
-    _GUID again;
-    _GUID object;
-    _GUID other;
+    _GUID entity, object, other, untouched;
     ASSERT_EQ(Zyr::getEntityClassIdFromString(text, &entity), Hsys::eSuccess);
-    ASSERT_EQ(Zyr::getEntityClassIdFromString(text, &again), Hsys::eSuccess);
     ASSERT_EQ(Zyr::getObjectClassIdFromString(text, &object), Hsys::eSuccess);
     ASSERT_EQ(Zyr::getEntityClassIdFromString(Zyr::constructClassID(L"ZyrAreaGroup"), &other),
               Hsys::eSuccess);
-    EXPECT_EQ(entity, again);
     EXPECT_NE(entity, object);
     EXPECT_NE(entity, other);
-    EXPECT_FALSE(entity.isNull());
-    EXPECT_EQ(entity.Data3 >> 12, 8) << "a name-derived id carries version 8";
-    EXPECT_EQ(entity.Data4[0] & 0xC0, 0x80);
-    // The id is part of the file format: it must not change between builds.
+    // The id is part of the file format: it must not change between builds. A name-derived id
+    // carries version 8 and the standard variant bits.
     EXPECT_EQ(hsGuidToString(entity), L"{83134DB6-7166-8D10-81F3-95B801E50811}");
-
-    _GUID untouched;
     EXPECT_EQ(Zyr::getObjectClassIdFromString(L"", &untouched), Hsys::eInvalidInput);
     EXPECT_EQ(Zyr::getObjectClassIdFromString(nullptr, &untouched), Hsys::eInvalidInput);
     EXPECT_TRUE(untouched.isNull());
@@ -53,22 +43,19 @@ TEST(ZyrClassIdManager, tiesEachClassToOneNumberAndBack) {
     EXPECT_FALSE(ZyrClassIdManager::append(a, 5501)) << "a class has one number";
     EXPECT_FALSE(ZyrClassIdManager::append(nullptr, 5502));
     ASSERT_TRUE(ZyrClassIdManager::append(b, 5501));
-
     unsigned short id = 0;
     EXPECT_TRUE(ZyrClassIdManager::classId(b, id));
     EXPECT_EQ(id, 5501);
     EXPECT_EQ(ZyrClassIdManager::classFor(5500), a);
-
     EXPECT_TRUE(ZyrClassIdManager::remove(a));
     EXPECT_FALSE(ZyrClassIdManager::remove(a));
     EXPECT_EQ(ZyrClassIdManager::classFor(5500), nullptr);
     EXPECT_FALSE(ZyrClassIdManager::classId(a, id));
     EXPECT_TRUE(ZyrClassIdManager::append(a, 5500)) << "a freed number is free again";
-
-    ZyrClassIdManager::remove(a);
-    ZyrClassIdManager::remove(b);
-    deleteHsRxClass(a);
-    deleteHsRxClass(b);
+    for (HsRxClass* cls : {a, b}) {
+        ZyrClassIdManager::remove(cls);
+        deleteHsRxClass(cls);
+    }
 }
 
 } // namespace

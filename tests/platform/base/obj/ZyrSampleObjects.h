@@ -1,17 +1,17 @@
 // Sample classes built on the object bases the way the module builds its own: a record pair, an
-// entity pair with members and a nested profile, and an override that lists records. Included
-// by one test file per executable, which registers the classes on first use.
+// entity pair with members and a nested profile, and an override that lists records. The public
+// classes add no fields and file no level of their own. Included by one test file per
+// executable, which registers the classes on first use.
 #pragma once
 
 #include "platform/base/geom/ZyrGeProfile.h"
-#include "platform/base/obj/ZyrConvertLegacyExtendData.h"
 #include "platform/base/obj/ZyrDbDictRecord.h"
 #include "platform/base/obj/ZyrDbGeo.h"
 #include "platform/base/obj/ZyrFiling.h"
 #include "platform/base/obj/ZyrImpDictRecord.h"
 #include "platform/base/obj/ZyrImpGeo.h"
+#include "platform/base/obj/ZyrLevelFiling.h"
 #include "platform/base/obj/ZyrOverride.h"
-#include "platform/base/obj/ZyrRegisterRelgraph.h"
 #include "platform/base/relgraph/ZyrAuditUtilities.h"
 #include "platform/base/relgraph/ZyrObjReferenceInfo.h"
 #include "platform/base/relgraph/ZyrObjReferenceMap.h"
@@ -47,35 +47,32 @@ public:
     }
 
     Hsys::ErrorStatus bdfInFields(HsDbBdfFiler* filer) override {
-        ZyrRegisterRelgraph relgraph(filer, this, ZyrImpSampleRecord::desc());
-        ZyrConvertLegacyExtendData legacy(filer, this, ZyrImpSampleRecord::desc());
-        if (const Hsys::ErrorStatus status = ZyrImpDictRecord::bdfInFields(filer);
-            status != Hsys::eSuccess)
-            return status;
-        if (const Hsys::ErrorStatus status = bdfInVersion(filer); status != Hsys::eSuccess)
-            return status;
-        filer->readDouble(m_width);
-        filer->readHardPointerId(m_styleId);
-        return filer->filerStatus();
+        return Zyr::bdfInLevel(
+            filer, this, desc(), [&] { return ZyrImpDictRecord::bdfInFields(filer); },
+            [&] { return bdfInVersion(filer); },
+            [&] {
+                filer->readDouble(m_width);
+                filer->readHardPointerId(m_styleId);
+                return Hsys::eSuccess;
+            });
     }
-
     Hsys::ErrorStatus bdfOutFields(HsDbBdfFiler* filer) const override {
-        if (const Hsys::ErrorStatus status = ZyrImpDictRecord::bdfOutFields(filer);
-            status != Hsys::eSuccess)
-            return status;
-        bdfOutVersion(filer);
-        filer->writeDouble(m_width);
-        filer->writeHardPointerId(m_styleId);
-        return filer->filerStatus();
+        return Zyr::bdfOutLevel(
+            filer, [&] { return ZyrImpDictRecord::bdfOutFields(filer); },
+            [&] { return bdfOutVersion(filer); },
+            [&] {
+                filer->writeDouble(m_width);
+                filer->writeHardPointerId(m_styleId);
+                return Hsys::eSuccess;
+            });
     }
 
     // A bad style is counted; with fix it is cleared, which a sample may do.
     Hsys::ErrorStatus audit(HsDbAuditInfo* info) override {
         ZyrImpDictRecord::audit(info);
         HsDbObject* parent = dbParent();
-        if (parent == nullptr || m_styleId.isNull())
-            return Hsys::eSuccess;
-        if (ZyrAuditUtilities::verifySymbolReferenceAndPrintAuditError(info, parent, m_styleId,
+        if (parent == nullptr || m_styleId.isNull() ||
+            ZyrAuditUtilities::verifySymbolReferenceAndPrintAuditError(info, parent, m_styleId,
                                                                        nullptr) == kGoodReference)
             return Hsys::eSuccess;
         info->errorsFound(1);
@@ -90,8 +87,7 @@ public:
 
     Hsys::ErrorStatus getReferencedObjects(ZyrObjReferenceMap& map) const override {
         ZyrImpDictRecord::getReferencedObjects(map);
-        map.addRecordReference(m_styleId);
-        return Hsys::eSuccess;
+        return map.addRecordReference(m_styleId);
     }
 
     void summaryInfo(ZyrDesc* desc) const override {
@@ -105,12 +101,10 @@ public:
         if (width == m_width)
             return Hsys::eSuccess;
         assertParentWriteEnabled();
-        recordParameterChanged(kWidthParameter, ZyrImpSampleRecord::desc(),
-                               ZyrParamChangeFlag::kAll, this);
+        recordParameterChanged(kWidthParameter, desc(), ZyrParamChangeFlag::kAll, this);
         m_width = width;
         return Hsys::eSuccess;
     }
-    const HsDbObjectId& styleId() const { return m_styleId; }
     Hsys::ErrorStatus setStyleId(const HsDbObjectId& id) {
         if (id == m_styleId)
             return Hsys::eSuccess;
@@ -134,26 +128,7 @@ class ZyrDbSampleRecord : public ZyrDbDictRecord {
 public:
     ZyrDbSampleRecord() : ZyrDbDictRecord(true) { setImp(new ZyrImpSampleRecord); }
 
-    Hsys::ErrorStatus bdfInFields(HsDbBdfFiler* filer) override {
-        ZyrRegisterRelgraph relgraph(filer, this, ZyrDbSampleRecord::desc());
-        ZyrConvertLegacyExtendData legacy(filer, this, ZyrDbSampleRecord::desc());
-        if (const Hsys::ErrorStatus status = ZyrDbDictRecord::bdfInFields(filer);
-            status != Hsys::eSuccess)
-            return status;
-        if (const Hsys::ErrorStatus status = bdfInVersion(filer); status != Hsys::eSuccess)
-            return status;
-        return filer->filerStatus();
-    }
-
-    Hsys::ErrorStatus bdfOutFields(HsDbBdfFiler* filer) const override {
-        if (const Hsys::ErrorStatus status = ZyrDbDictRecord::bdfOutFields(filer);
-            status != Hsys::eSuccess)
-            return status;
-        return bdfOutVersion(filer);
-    }
-
     ZyrImpSampleRecord* sampleImp() { return ZyrImpSampleRecord::cast(imp()); }
-    const ZyrImpSampleRecord* sampleImp() const { return ZyrImpSampleRecord::cast(imp()); }
 };
 
 HSRX_DEFINE_MEMBERS(ZyrDbSampleRecord, ZyrDbDictRecord, 0, hsrxInstantiateClass<ZyrDbSampleRecord>)
@@ -167,29 +142,25 @@ public:
     ~ZyrImpSampleShape() override { delete m_profile; }
 
     Hsys::ErrorStatus bdfInFields(HsDbBdfFiler* filer) override {
-        ZyrRegisterRelgraph relgraph(filer, this, ZyrImpSampleShape::desc());
-        ZyrConvertLegacyExtendData legacy(filer, this, ZyrImpSampleShape::desc());
-        if (const Hsys::ErrorStatus status = ZyrImpGeo::bdfInFields(filer);
-            status != Hsys::eSuccess)
-            return status;
-        if (const Hsys::ErrorStatus status = bdfInVersion(filer); status != Hsys::eSuccess)
-            return status;
-        if (HsDbFilerSupport::bdfReadSoftPointerVector(filer, m_members, true) != Hsys::eSuccess)
-            return filer->filerStatus();
-        if (const Hsys::ErrorStatus status = Zyr::readObject(
-                filer, this, m_profile, static_cast<unsigned short>(filedVersion()));
-            status != Hsys::eSuccess)
-            return status;
-        return filer->filerStatus();
+        return Zyr::bdfInLevel(
+            filer, this, desc(), [&] { return ZyrImpGeo::bdfInFields(filer); },
+            [&] { return bdfInVersion(filer); },
+            [&] {
+                if (HsDbFilerSupport::bdfReadSoftPointerVector(filer, m_members, true) !=
+                    Hsys::eSuccess)
+                    return filer->filerStatus();
+                return Zyr::readObject(filer, this, m_profile,
+                                       static_cast<unsigned short>(filedVersion()));
+            });
     }
-
     Hsys::ErrorStatus bdfOutFields(HsDbBdfFiler* filer) const override {
-        if (const Hsys::ErrorStatus status = ZyrImpGeo::bdfOutFields(filer);
-            status != Hsys::eSuccess)
-            return status;
-        bdfOutVersion(filer);
-        HsDbFilerSupport::bdfWriteSoftPointerVector(filer, m_members);
-        return Zyr::writeObject(filer, m_profile, 80);
+        return Zyr::bdfOutLevel(
+            filer, [&] { return ZyrImpGeo::bdfOutFields(filer); },
+            [&] { return bdfOutVersion(filer); },
+            [&] {
+                HsDbFilerSupport::bdfWriteSoftPointerVector(filer, m_members);
+                return Zyr::writeObject(filer, m_profile, 80);
+            });
     }
 
     Hsys::ErrorStatus getReferencedObjects(ZyrObjReferenceMap& map) const override {
@@ -219,8 +190,7 @@ public:
         assertParentWriteEnabled();
         delete m_profile;
         m_profile = profile;
-        if (m_profile != nullptr)
-            m_profile->setParent(this);
+        m_profile->setParent(this);
     }
 
 private:
@@ -236,25 +206,7 @@ class ZyrDbSampleShape : public ZyrDbGeo {
 public:
     ZyrDbSampleShape() : ZyrDbGeo(true) { setImp(new ZyrImpSampleShape); }
 
-    Hsys::ErrorStatus bdfInFields(HsDbBdfFiler* filer) override {
-        ZyrRegisterRelgraph relgraph(filer, this, ZyrDbSampleShape::desc());
-        ZyrConvertLegacyExtendData legacy(filer, this, ZyrDbSampleShape::desc());
-        if (const Hsys::ErrorStatus status = ZyrDbGeo::bdfInFields(filer); status != Hsys::eSuccess)
-            return status;
-        if (const Hsys::ErrorStatus status = bdfInVersion(filer); status != Hsys::eSuccess)
-            return status;
-        return filer->filerStatus();
-    }
-
-    Hsys::ErrorStatus bdfOutFields(HsDbBdfFiler* filer) const override {
-        if (const Hsys::ErrorStatus status = ZyrDbGeo::bdfOutFields(filer);
-            status != Hsys::eSuccess)
-            return status;
-        return bdfOutVersion(filer);
-    }
-
     ZyrImpSampleShape* shapeImp() { return ZyrImpSampleShape::cast(imp()); }
-    const ZyrImpSampleShape* shapeImp() const { return ZyrImpSampleShape::cast(imp()); }
 };
 
 HSRX_DEFINE_MEMBERS(ZyrDbSampleShape, ZyrDbGeo, 0, hsrxInstantiateClass<ZyrDbSampleShape>)
@@ -276,23 +228,19 @@ public:
     }
 
     Hsys::ErrorStatus bdfInFields(HsDbBdfFiler* filer) override {
-        ZyrRegisterRelgraph relgraph(filer, this, ZyrSampleOverride::desc());
-        ZyrConvertLegacyExtendData legacy(filer, this, ZyrSampleOverride::desc());
-        if (const Hsys::ErrorStatus status = ZyrOverride::bdfInFields(filer);
-            status != Hsys::eSuccess)
-            return status;
-        if (const Hsys::ErrorStatus status = bdfInVersion(filer); status != Hsys::eSuccess)
-            return status;
-        HsDbFilerSupport::bdfReadHardPointerVector(filer, m_records, true);
-        return filer->filerStatus();
+        return Zyr::bdfInLevel(
+            filer, this, desc(), [&] { return ZyrOverride::bdfInFields(filer); },
+            [&] { return bdfInVersion(filer); },
+            [&] {
+                HsDbFilerSupport::bdfReadHardPointerVector(filer, m_records, true);
+                return Hsys::eSuccess;
+            });
     }
-
     Hsys::ErrorStatus bdfOutFields(HsDbBdfFiler* filer) const override {
-        if (const Hsys::ErrorStatus status = ZyrOverride::bdfOutFields(filer);
-            status != Hsys::eSuccess)
-            return status;
-        bdfOutVersion(filer);
-        return HsDbFilerSupport::bdfWriteHardPointerVector(filer, m_records);
+        return Zyr::bdfOutLevel(
+            filer, [&] { return ZyrOverride::bdfOutFields(filer); },
+            [&] { return bdfOutVersion(filer); },
+            [&] { return HsDbFilerSupport::bdfWriteHardPointerVector(filer, m_records); });
     }
 
     Hsys::ErrorStatus getReferencedObjects(ZyrObjReferenceMap& map) const override {

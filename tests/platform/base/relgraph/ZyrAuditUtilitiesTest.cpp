@@ -18,8 +18,7 @@ protected:
         entity = add(database, new ZyrDbSampleShape);
         foreign = add(other, new ZyrDbSampleRecord);
         ASSERT_EQ(database.getHsDbObjectId(missing, true, 4242), Hsys::eSuccess);
-        HsDbObjectPointer<HsDbObject> object(erased, HsDb::kForWrite);
-        ASSERT_EQ(object->erase(), Hsys::eSuccess);
+        ASSERT_EQ(HsDbObjectPointer<HsDbObject>(erased, HsDb::kForWrite)->erase(), Hsys::eSuccess);
     }
 
     static HsDbObjectId add(HsDbDatabase& db, HsDbObject* object) {
@@ -56,9 +55,7 @@ TEST_F(ZyrAuditUtilitiesOn, everyKindOfBadReferenceHasItsVerdict) {
         EXPECT_EQ(
             Zyr::verifySymbolReference(owner.object(), c.id, record, c.allowNull, c.allowErased),
             c.verdict)
-            << c.name << ": "
-            << toString(Zyr::verifySymbolReference(owner.object(), c.id, record, c.allowNull,
-                                                   c.allowErased));
+            << c.name;
     ZyrDbSampleRecord inNoDatabase;
     EXPECT_EQ(Zyr::verifySymbolReference(&inNoDatabase, foreign, record, 0, 0), kGoodReference);
     EXPECT_EQ(Zyr::verifySymbolReference(owner.object(), entity, nullptr, 0, 0), kGoodReference);

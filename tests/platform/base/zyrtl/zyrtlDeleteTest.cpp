@@ -15,19 +15,14 @@ struct Counted {
     int& m_alive;
 };
 
-TEST(zyrtlDelete, deleteItemsDeletesEveryPointerAndEmptiesTheContainer) {
+TEST(zyrtlDelete, deleteItemsEmptiesTheContainerAndDeleteItemServesRemoveIfBothSkippingNull) {
     int alive = 0;
-    std::deque<Counted*> items{new Counted(alive), nullptr, new Counted(alive)};
-    ASSERT_EQ(alive, 2);
-    zyrtl::deleteItems(items);
-    EXPECT_EQ(alive, 0);
-    EXPECT_TRUE(items.empty());
-}
-
-TEST(zyrtlDelete, deleteItemServesRemoveIfAndSkipsNull) {
-    int alive = 0;
+    std::deque<Counted*> queue{new Counted(alive), nullptr, new Counted(alive)};
+    zyrtl::deleteItems(queue);
+    EXPECT_TRUE(queue.empty());
     std::vector<Counted*> items{new Counted(alive), nullptr, new Counted(alive)};
-    items.erase(std::remove_if(items.begin(), items.end(), zyrtl::deleteItem<Counted*>()), items.end());
+    ASSERT_EQ(alive, 2);
+    std::erase_if(items, zyrtl::deleteItem<Counted*>());
     EXPECT_EQ(alive, 0);
     EXPECT_TRUE(items.empty());
 }
