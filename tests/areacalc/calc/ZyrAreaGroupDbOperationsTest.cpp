@@ -1,13 +1,16 @@
 // The short road of values: single gross and net values of areas and group trees without a
-// stream, where they agree with the engine and where they differ on purpose.
+// stream, where they agree with the engine and where they differ on purpose; and the sample area
+// that style previews show.
 #include "tests/areacalc/calc/ZyrCalculationDrawing.h"
 
 #include "areacalc/calc/ZyrAreaDbOperations.h"
 #include "areacalc/calc/ZyrAreaGroupCalculationFunctor.h"
 #include "areacalc/calc/ZyrAreaGroupDbOperations.h"
 #include "platform/base/summary/ZyrDesc.h"
+#include "platform/host/db/HsDbHostApplicationServices.h"
+#include "platform/host/db/HsDbLayerTable.h"
 
-#include <gtest/gtest.h>
+#include <numbers>
 
 namespace {
 
@@ -66,7 +69,8 @@ TEST_F(ZyrAreaGroupDbOperationsTest, addsToTheResultAndLeavesOutWhatAGroupDoesNo
 
     EXPECT_NEAR(groupValue(&ZyrAreaGroupDbOperations::area, top, Hsys::eSuccess, 5.0), 25.0, 1e-12)
         << "added to the caller's running total; the narrow group and the erased area add nothing";
-    EXPECT_NEAR(groupValue(&ZyrAreaGroupDbOperations::area, empty, Hsys::eSuccess, 3.0), 3.0, 1e-12);
+    EXPECT_NEAR(groupValue(&ZyrAreaGroupDbOperations::area, empty, Hsys::eSuccess, 3.0), 3.0,
+                1e-12);
     EXPECT_NEAR(groupValue(&ZyrAreaGroupDbOperations::perimeter, top), 18.0 + 40.0, 1e-12);
     double untouched = 7.0;
     EXPECT_EQ(ZyrAreaGroupDbOperations::area(nullptr, untouched), Hsys::eNullPointer);
@@ -89,9 +93,11 @@ TEST_F(ZyrAreaGroupDbOperationsTest, reportsOnlyTheLastMemberTriedAndOpensAreasB
         EXPECT_EQ(value, -1.0);
     }
     double value = -1.0;
-    EXPECT_EQ(ZyrAreaDbOperations::area(busyFirst, value), Hsys::eWrongClass) << "a group is no area";
+    EXPECT_EQ(ZyrAreaDbOperations::area(busyFirst, value), Hsys::eWrongClass)
+        << "a group is no area";
     EXPECT_EQ(value, -1.0);
-    EXPECT_EQ(ZyrAreaDbOperations::area(static_cast<ZyrDbArea*>(nullptr), value), Hsys::eNullPointer);
+    EXPECT_EQ(ZyrAreaDbOperations::area(static_cast<ZyrDbArea*>(nullptr), value),
+              Hsys::eNullPointer);
     EXPECT_EQ(ZyrAreaDbOperations::area(good, value), Hsys::eSuccess);
     EXPECT_NEAR(value, 12.0, 1e-12);
     EXPECT_EQ(HsDbObjectPointer<ZyrDbArea>(good, HsDb::kForWrite).openStatus(), Hsys::eSuccess)
@@ -113,14 +119,16 @@ TEST_F(ZyrAreaGroupDbOperationsTest, theFunctorSumsDirectAreasOfAllowingGroupsOn
     EXPECT_NEAR(sum.sum, 4.0 + 9.0, 1e-12) << "the parent's child group is not descended into";
 }
 
-TEST_F(ZyrAreaGroupDbOperationsTest, aFailingModifierKeepsTheValueOnBothRoadsButOnlyTheShortOneSaysSo) {
+TEST_F(ZyrAreaGroupDbOperationsTest,
+       aFailingModifierKeepsTheValueOnBothRoadsButOnlyTheShortOneSaysSo) {
     const HsDbObjectId broken = addAreaModifier(L"Broken", L"_AREA_VALUE_ / 0");
     const HsDbObjectId half = addAreaModifier(L"Half", L"_AREA_VALUE_ * 0.5");
     const HsDbObjectId failsLast = addRoom(L"FailsLast", 4, 5);
     const HsDbObjectId failsFirst = addRoom(L"FailsFirst", 2, 5);
     attachModifiers(failsLast, {half, broken});
     attachModifiers(failsFirst, {broken, half});
-    ASSERT_EQ(calculate({failsLast, failsFirst}), Hsys::eSuccess) << "the engine ignores the failure";
+    ASSERT_EQ(calculate({failsLast, failsFirst}), Hsys::eSuccess)
+        << "the engine ignores the failure";
     double last = -1.0;
     double first = -1.0;
     EXPECT_NE(ZyrAreaDbOperations::areaModified(failsLast, last), Hsys::eSuccess);
@@ -158,6 +166,25 @@ TEST_F(ZyrAreaGroupDbOperationsTest, summariesShowModifiersAndTheNetValuesBeside
               (std::vector<std::wstring>{L"Area: 20.00 m\u00b2", L"Perimeter: 18.00 m",
                                          L"Net area: 5.00 m\u00b2", L"Net perimeter: 18.00 m"}))
         << "the group's modifier halves the sum of its members' net values";
+}
+
+TEST_F(ZyrAreaGroupDbOperationsTest, theSampleIsAnOutlineWithAnArcAndAHoleOnTheAreaLayer) {
+    hsdbHostApplicationServices()->setWorkingDatabase(&database);
+    std::unique_ptr<ZyrDbArea> sample(ZyrAreaDbOperations::sample(nullptr));
+    hsdbHostApplicationServices()->setWorkingDatabase(nullptr);
+    ASSERT_NE(sample, nullptr);
+    EXPECT_TRUE(sample->objectId().isNull());
+    EXPECT_EQ(sample->styleId(), standardStyle);
+    const ZyrGeProfile* profile = sample->profile();
+    ASSERT_EQ(profile->ringCount(), 2);
+    EXPECT_NEAR(profile->ring(0)->area(), 80.0 + 12.0 * std::numbers::pi, 1e-9);
+    EXPECT_NEAR(profile->ring(1)->area(), -22.5, 1e-9);
+    EXPECT_TRUE(profile->isValidProfile(true));
+    HsDbObjectPointer<HsDbLayerTableRecord> layer(sample->layerId(), HsDb::kForRead);
+    const wchar_t* name = nullptr;
+    ASSERT_TRUE(layer);
+    ASSERT_EQ(layer->getName(name), Hsys::eSuccess);
+    EXPECT_STREQ(name, L"AREA");
 }
 
 } // namespace

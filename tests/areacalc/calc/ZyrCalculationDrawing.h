@@ -1,67 +1,42 @@
-// A drawing with the module's services running and both algorithms attached, with helpers for
-// groups that allow chosen calculations, modifiers on objects, and one calculation into a stream.
+// A drawing with both algorithms attached to the white board, with helpers for modifiers on
+// objects and one calculation into a stream.
 #pragma once
+
+#include "tests/areacalc/ZyrAreaDrawing.h"
 
 #include "areacalc/calc/ZyrAreaCalculationEngine.h"
 #include "areacalc/calc/ZyrAreaCalculationStream.h"
 #include "areacalc/calc/ZyrAreaCalculationWhiteBoard.h"
 #include "areacalc/modifiers/ZyrDbAreaModifierOperations.h"
-#include "areacalc/objects/ZyrDbAreaGroup.h"
-#include "tests/areacalc/modifiers/ZyrAreaModifierDrawing.h"
 
 #include <functional>
 #include <string>
 #include <vector>
 
-using Ids = std::vector<HsDbObjectId>;
-using Classes = std::vector<HsRxClass*>;
-
-class ZyrCalculationDrawing : public ZyrAreaModifierDrawing {
+class ZyrCalculationDrawing : public ZyrAreaDrawing {
 protected:
     void SetUp() override {
-        ZyrAreaModifierDrawing::SetUp();
+        ZyrAreaDrawing::SetUp();
         board = ZyrAreaCalculationTestModule::services().whiteBoard();
         ASSERT_EQ(board->detachAlgorithm(nullptr), Hsys::eSuccess);
         ASSERT_EQ(board->attachAlgorithm(areaAlgorithm()), Hsys::eSuccess);
         ASSERT_EQ(board->attachAlgorithm(perimeterAlgorithm()), Hsys::eSuccess);
     }
 
-    // A group of the drawing; every algorithm is allowed unless a list is given.
-    HsDbObjectId addGroup(const wchar_t* name, const Ids& nodes, const Ids& leafs,
-                          const Classes* allowed = nullptr) {
-        auto* group = new ZyrDbAreaGroup;
-        EXPECT_EQ(group->setName(name), Hsys::eSuccess);
-        HsDbObjectId id;
-        EXPECT_EQ(database.addHsDbObject(id, group), Hsys::eSuccess);
-        for (const HsDbObjectId& node : nodes)
-            EXPECT_EQ(group->groupHandler()->addNode(node), Hsys::eSuccess);
-        for (const HsDbObjectId& leaf : leafs)
-            EXPECT_EQ(group->groupHandler()->addLeaf(leaf), Hsys::eSuccess);
-        if (allowed != nullptr) {
-            group->algorithms().clear();
-            for (HsRxClass* cls : *allowed)
-                EXPECT_EQ(group->algorithms().add(cls), Hsys::eSuccess);
-        }
-        group->close();
-        return id;
-    }
     HsDbObjectId addRoom(const wchar_t* name, double width, double depth) {
         return addArea(name, rectangle(width, depth));
     }
     void attachModifiers(const HsDbObjectId& id, const Ids& modifiers) {
-        HsDbObject* object = nullptr;
-        ASSERT_EQ(hsdbOpenObject(object, id, HsDb::kForWrite), Hsys::eSuccess);
-        EXPECT_EQ(ZyrDbAreaModifierOperations::appendModifier(ZyrDbEntity::cast(object), modifiers),
+        HsDbObjectPointer<ZyrDbEntity> entity(id, HsDb::kForWrite);
+        EXPECT_EQ(ZyrDbAreaModifierOperations::appendModifier(entity.object(), modifiers),
                   Hsys::eSuccess);
-        object->close();
     }
     // A modifier of the drawing acting on the area algorithm only.
     HsDbObjectId addAreaModifier(const wchar_t* name, const wchar_t* formula) {
         const HsDbObjectId id = addModifier(name, formula);
-        ZyrDbAreaModifier* modifier = nullptr;
-        EXPECT_EQ(ZyrDbAreaModifier::open(modifier, id, HsDb::kForWrite), Hsys::eSuccess);
-        EXPECT_EQ(modifier->removeAlgorithm(perimeterAlgorithm()), Hsys::eSuccess);
-        modifier->close();
+        EXPECT_EQ(HsDbObjectPointer<ZyrDbAreaModifier>(id, HsDb::kForWrite)
+                      ->removeAlgorithm(perimeterAlgorithm()),
+                  Hsys::eSuccess);
         return id;
     }
 

@@ -1,6 +1,6 @@
 // Modifiers attached to entities: the override that lists them, filed in a drawing and audited,
 // and the operations that change the list, name it, compare it and apply it to a value.
-#include "tests/areacalc/modifiers/ZyrAreaModifierDrawing.h"
+#include "tests/areacalc/ZyrAreaDrawing.h"
 
 #include "areacalc/modifiers/ZyrDbAreaModifierOperations.h"
 #include "areacalc/modifiers/ZyrOverrideCalculationModifier.h"
@@ -11,20 +11,17 @@
 #include "platform/base/summary/ZyrDesc.h"
 #include "platform/host/db/HsDbAuditInfo.h"
 
-#include <filesystem>
 #include <functional>
-#include <unistd.h>
 
 namespace {
 
 using Ops = ZyrDbAreaModifierOperations;
-using Ids = std::vector<HsDbObjectId>;
 using Status = Hsys::ErrorStatus;
 
-class ZyrModifierAttachment : public ZyrAreaModifierDrawing {
+class ZyrModifierAttachment : public ZyrAreaDrawing {
 protected:
     void SetUp() override {
-        ZyrAreaModifierDrawing::SetUp();
+        ZyrAreaDrawing::SetUp();
         half = addModifier(L"Half", L"_AREA_VALUE_*0.5");
         balcony = addModifier(L"Balcony", L"_AREA_VALUE_*share", {{L"share", 0.25}});
         HsDbObjectPointer<ZyrDbAreaModifier> modifier(balcony, HsDb::kForWrite);
@@ -65,27 +62,19 @@ TEST_F(ZyrModifierAttachment, modifiersAndTheirOverrideComeBackFromADrawingFile)
     EXPECT_EQ(appliedTo(room, areaAlgorithm(), 12), 1.5);
     EXPECT_EQ(appliedTo(room, perimeterAlgorithm(), 14), 7.0) << "the balcony acts on areas only";
 
-    const std::filesystem::path file = std::filesystem::temp_directory_path() /
-                                       ("zyrmodifier-" + std::to_string(::getpid()) + ".drawing");
-    ASSERT_EQ(database.saveAs(file.wstring().c_str()), Hsys::eSuccess);
-    HsDbDatabase loaded(HsDb::kEmptyDatabase);
-    ASSERT_EQ(loaded.readDrawingFile(file.wstring().c_str()), Hsys::eSuccess);
-    std::filesystem::remove(file);
-    const auto reloaded = [&](const HsDbObjectId& id) {
-        HsDbObjectId found;
-        EXPECT_EQ(loaded.getHsDbObjectId(found, false, id.handle()), Hsys::eSuccess);
-        return found;
-    };
-    EXPECT_EQ(modifiersOf(reloaded(room)), (Ids{reloaded(half), reloaded(balcony)}));
-    EXPECT_EQ(appliedTo(reloaded(room), areaAlgorithm(), 12), 1.5);
-    EXPECT_EQ(appliedTo(reloaded(room), perimeterAlgorithm(), 14), 7.0);
-    const HsDbObjectPointer<ZyrDbAreaModifier> opened(reloaded(balcony), HsDb::kForRead);
+    std::unique_ptr<HsDbDatabase> loaded = reloaded();
+    const auto mapped = [&](const HsDbObjectId& id) { return there(*loaded, {id})[0]; };
+    EXPECT_EQ(modifiersOf(mapped(room)), (Ids{mapped(half), mapped(balcony)}));
+    EXPECT_EQ(appliedTo(mapped(room), areaAlgorithm(), 12), 1.5);
+    EXPECT_EQ(appliedTo(mapped(room), perimeterAlgorithm(), 14), 7.0);
+    const HsDbObjectPointer<ZyrDbAreaModifier> opened(mapped(balcony), HsDb::kForRead);
     ASSERT_TRUE(opened);
     const ZyrDbAreaModifier& modifier = *opened.object();
-    EXPECT_EQ(modifier.expression(), L"_AREA_VALUE_*share");
-    EXPECT_EQ(modifier.parameterPairVector(),
-              (ZyrDbAreaModifier::ParameterPairVector{{L"share", 0.25}}));
-    EXPECT_EQ(modifier.algorithms().items(), (std::vector<HsRxClass*>{areaAlgorithm()}));
+    EXPECT_EQ(std::tuple(modifier.expression().str(), modifier.parameterPairVector(),
+                         modifier.algorithms().items()),
+              std::tuple(std::wstring(L"_AREA_VALUE_*share"),
+                         ZyrDbAreaModifier::ParameterPairVector{{L"share", 0.25}},
+                         Classes{areaAlgorithm()}));
 }
 
 // Each case on a new room without modifiers, open for write unless it says otherwise.

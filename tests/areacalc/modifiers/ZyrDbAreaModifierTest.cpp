@@ -1,6 +1,6 @@
 // Area modifier records: their cache of results, changes of formula and parameters, formulas
 // written out, copies, summaries, binary filing and the old text stream.
-#include "tests/areacalc/modifiers/ZyrAreaModifierDrawing.h"
+#include "tests/areacalc/ZyrAreaDrawing.h"
 
 #include "areacalc/calc/ZyrAreaCalculationAlgorithm.h"
 #include "areacalc/objects/ZyrDbAreaStyle.h"
@@ -9,11 +9,9 @@
 #include "platform/host/filer/HsDbTdfFiler.h"
 #include "platform/host/ge/HsGeContext.h"
 
-#include <functional>
-
 namespace {
 
-using ZyrAreaModifiers = ZyrAreaModifierDrawing;
+using ZyrAreaModifiers = ZyrAreaDrawing;
 using Parameters = ZyrImpAreaModifier::ParameterPairVector;
 using Status = Hsys::ErrorStatus;
 
@@ -90,58 +88,43 @@ TEST_F(ZyrAreaModifiers, aFailedEvaluationCachesNothingAndIsTriedAgain) {
 
 // A refused change keeps both the record and its results.
 TEST_F(ZyrAreaModifiers, aChangedFormulaEmptiesTheCacheAtTheNextEvaluation) {
-    using Change = std::function<Status(ZyrDbAreaModifier&)>;
+    using M = ZyrDbAreaModifier;
     const struct {
-        const char* what;
-        Change change;
+        Status (*change)(M&);
         Status status;
         double resultOfFive;
         bool keepsResults;
     } cases[] = {
-        {"same formula", [](auto& m) { return m.setExpression(L"_AREA_VALUE_*k+j"); },
-         Hsys::eSuccess, 10, true},
-        {"new formula", [](auto& m) { return m.setExpression(L"_AREA_VALUE_*k+1"); },
-         Hsys::eSuccess, 11, false},
-        {"added parameter", [](auto& m) { return m.addParameter(L"h", 1); }, Hsys::eSuccess, 10,
-         false},
-        {"removed parameter", [](auto& m) { return m.removeParameter(L"i"); }, Hsys::eSuccess, 10,
-         false},
-        {"removed algorithm", [](auto& m) { return m.removeAlgorithm(areaAlgorithm()); },
-         Hsys::eSuccess, 10, true},
-        {"renamed missing name", [](auto& m) { return m.renameParameterName(L"x", L"j"); },
-         Hsys::eNameNotFound, 10, false},
-        {"renamed to itself", [](auto& m) { return m.renameParameterName(L"k", L"k"); },
-         Hsys::eSuccess, 10, true},
-        {"added present name", [](auto& m) { return m.addParameter(L"k", 3); },
-         Hsys::eDuplicateName, 10, true},
-        {"removed missing name", [](auto& m) { return m.removeParameter(L"x"); },
-         Hsys::eNameNotFound, 10, true},
-        {"added no algorithm", [](auto& m) { return m.addAlgorithm(nullptr); }, Hsys::eBadArgument,
-         10, true},
-        {"added present algorithm", [](auto& m) { return m.addAlgorithm(areaAlgorithm()); },
-         Hsys::eDuplicateName, 10, true},
-        {"removed no algorithm", [](auto& m) { return m.removeAlgorithm(nullptr); },
-         Hsys::eBadArgument, 10, true},
-        {"removed absent algorithm",
-         [](auto& m) { return m.removeAlgorithm(ZyrDbAreaStyle::desc()); }, Hsys::eNameNotFound, 10,
+        {[](M& m) { return m.setExpression(L"_AREA_VALUE_*k+j"); }, Hsys::eSuccess, 10, true},
+        {[](M& m) { return m.setExpression(L"_AREA_VALUE_*k+1"); }, Hsys::eSuccess, 11, false},
+        {[](M& m) { return m.addParameter(L"h", 1); }, Hsys::eSuccess, 10, false},
+        {[](M& m) { return m.removeParameter(L"i"); }, Hsys::eSuccess, 10, false},
+        {[](M& m) { return m.removeAlgorithm(areaAlgorithm()); }, Hsys::eSuccess, 10, true},
+        {[](M& m) { return m.renameParameterName(L"x", L"j"); }, Hsys::eNameNotFound, 10, false},
+        {[](M& m) { return m.renameParameterName(L"k", L"k"); }, Hsys::eSuccess, 10, true},
+        {[](M& m) { return m.addParameter(L"k", 3); }, Hsys::eDuplicateName, 10, true},
+        {[](M& m) { return m.removeParameter(L"x"); }, Hsys::eNameNotFound, 10, true},
+        {[](M& m) { return m.addAlgorithm(nullptr); }, Hsys::eBadArgument, 10, true},
+        {[](M& m) { return m.addAlgorithm(areaAlgorithm()); }, Hsys::eDuplicateName, 10, true},
+        {[](M& m) { return m.removeAlgorithm(nullptr); }, Hsys::eBadArgument, 10, true},
+        {[](M& m) { return m.removeAlgorithm(ZyrDbAreaStyle::desc()); }, Hsys::eNameNotFound, 10,
          true},
     };
-    for (const auto& c : cases) {
-        SCOPED_TRACE(c.what);
+    for (std::size_t i = 0; i < std::size(cases); ++i) {
+        SCOPED_TRACE(i);
+        const auto& c = cases[i];
         ZyrDbAreaModifier modifier;
-        ASSERT_EQ(modifier.algorithms().items(),
-                  (std::vector<HsRxClass*>{areaAlgorithm(), perimeterAlgorithm()}));
+        ASSERT_EQ(modifier.algorithms().items(), (Classes{areaAlgorithm(), perimeterAlgorithm()}));
         ASSERT_EQ(modifier.setExpression(L"_AREA_VALUE_*k+j"), Hsys::eSuccess);
-        ASSERT_EQ(modifier.addParameter(L"k", 2), Hsys::eSuccess);
-        ASSERT_EQ(modifier.addParameter(L"j", 0), Hsys::eSuccess);
-        ASSERT_EQ(modifier.addParameter(L"i", 7), Hsys::eSuccess);
+        for (const auto& [name, value] : {std::pair{L"k", 2}, {L"j", 0}, {L"i", 7}})
+            ASSERT_EQ(modifier.addParameter(name, value), Hsys::eSuccess);
         evaluated(modifier, 5);
         evaluated(modifier, 6);
         const Parameters parameters = modifier.parameterPairVector();
         EXPECT_EQ(c.change(modifier), c.status);
         if (c.status != Hsys::eSuccess) {
-            EXPECT_EQ(modifier.parameterPairVector(), parameters);
-            EXPECT_EQ(modifier.algorithms().count(), 2);
+            EXPECT_EQ(std::pair(modifier.parameterPairVector(), modifier.algorithms().count()),
+                      std::pair(parameters, 2));
         }
         EXPECT_EQ(cacheOf(modifier).size(), 2u) << "stale results stay until the next evaluation";
         EXPECT_EQ(evaluated(modifier, 5), c.resultOfFive);
@@ -174,8 +157,8 @@ TEST_F(ZyrAreaModifiers, aCopyTakesFormulaAndAlgorithmsButKeepsItsFormerResults)
     ZyrDbAreaModifier copy;
     EXPECT_EQ(evaluated(copy, 5), 5.0);
     ASSERT_EQ(copy.areaModifierImp()->copyFrom(source.areaModifierImp()), Hsys::eSuccess);
-    EXPECT_EQ(copy.parameterPairVector(), source.parameterPairVector());
-    EXPECT_EQ(copy.algorithms(), source.algorithms());
+    EXPECT_EQ(std::pair(copy.parameterPairVector(), copy.algorithms().items()),
+              std::pair(source.parameterPairVector(), source.algorithms().items()));
     EXPECT_EQ(evaluated(copy, 5), 5.0) << "the result of the former formula";
     EXPECT_EQ(evaluated(copy, 6), 18.0);
 
@@ -240,24 +223,25 @@ TEST_F(ZyrAreaModifiers, theRecordIsFiledInItsOrderAndReadWholeOrNotAtAll) {
         ZyrImpAreaModifier read;
         ASSERT_EQ(read.bdfInFields(&reader), status) << filed.size();
         const bool whole = status == Hsys::eSuccess;
-        ASSERT_EQ(read.expression(), whole ? roof.expression() : L"_AREA_VALUE_") << filed.size();
-        ASSERT_EQ(read.parameterPairVector(), whole ? roof.parameterPairVector() : Parameters{});
-        ASSERT_EQ(read.algorithms().count(), whole ? 1 : 2);
+        ASSERT_EQ(
+            std::tuple(read.expression(), read.parameterPairVector(), read.algorithms().count()),
+            whole ? std::tuple(roof.expression(), roof.parameterPairVector(), 1)
+                  : std::tuple(ZyrRmCString(L"_AREA_VALUE_"), Parameters{}, 2))
+            << filed.size();
     }
 }
 
+// Names and values pair by position; a later formula wins and a foreign group ends the read.
 TEST_F(ZyrAreaModifiers, anOldGroupStreamPairsNamesWithValuesByPosition) {
     const struct {
-        const char* what;
         std::vector<HsDbTdfItem> items;
         Status status;
         const wchar_t* formula;
         Parameters parameters;
-        std::vector<HsRxClass*> algorithms;
+        Classes algorithms;
         std::size_t position;
     } cases[] = {
-        {"two names and one value",
-         {{1, L"_AREA_VALUE_*a"},
+        {{{1, L"_AREA_VALUE_*a"},
           {2, L"a"},
           {2, L"b"},
           {40, 0.5},
@@ -267,30 +251,21 @@ TEST_F(ZyrAreaModifiers, anOldGroupStreamPairsNamesWithValuesByPosition) {
          {{L"a", 0.5}},
          {areaAlgorithm()},
          5},
-        {"a later formula wins and a foreign group ends the read",
-         {{1, L"a"}, {40, 1.0}, {40, 2.0}, {1, L"_AREA_VALUE_"}, {2, L"a"}, {70, 5}, {1, L"x"}},
+        {{{1, L"a"}, {40, 1.0}, {40, 2.0}, {1, L"_AREA_VALUE_"}, {2, L"a"}, {70, 5}, {1, L"x"}},
          Hsys::eSuccess,
          L"_AREA_VALUE_",
          {{L"a", 1.0}},
          {},
          5},
-        {"a value of the wrong type",
-         {{1, L"f"}, {40, L"text"}},
-         Hsys::eWrongType,
-         L"f",
-         {},
-         {},
-         2},
+        {{{1, L"f"}, {40, L"text"}}, Hsys::eWrongType, L"f", {}, {}, 2},
     };
     for (const auto& c : cases) {
-        SCOPED_TRACE(c.what);
         HsDbTdfFiler filer(c.items, HsDb::kFileFiler, false);
         ZyrImpAreaModifier modifier;
-        EXPECT_EQ(modifier.tdfInFieldsQuillon(&filer), c.status);
-        EXPECT_EQ(modifier.expression(), c.formula);
-        EXPECT_EQ(modifier.parameterPairVector(), c.parameters);
-        EXPECT_EQ(modifier.algorithms().items(), c.algorithms);
-        EXPECT_EQ(filer.position(), c.position);
+        EXPECT_EQ(modifier.tdfInFieldsQuillon(&filer), c.status) << c.formula;
+        EXPECT_EQ(std::tuple(modifier.expression().str(), modifier.parameterPairVector(),
+                             modifier.algorithms().items(), filer.position()),
+                  std::tuple(std::wstring(c.formula), c.parameters, c.algorithms, c.position));
     }
 }
 

@@ -1,13 +1,10 @@
 // Area groups in a drawing: a tree filed through a drawing file, old and current streams, the old
-// text form, extents, copies, references, defaults, audits, summaries, redraws, and areas that
-// leave their groups when another class takes their place.
+// text form, extents, copies, references, audits, summaries, redraws, and areas that leave their
+// groups when another class takes their place.
 #include "tests/areacalc/ZyrAreaDrawing.h"
-#include "tests/areacalc/module/ZyrAreaCalculationTestModule.h"
 
 #include "areacalc/calc/ZyrAreaCalculationAlgorithm.h"
-#include "areacalc/objects/ZyrCompSpecTemplate.h"
 #include "platform/base/app/ZyrBaseServices.h"
-#include "platform/base/geom/ZyrGeBoundBox3d.h"
 #include "platform/base/obj/ZyrImpGeo.h"
 #include "platform/base/relgraph/ZyrObjReferenceInfo.h"
 #include "platform/base/relgraph/ZyrObjReferenceMap.h"
@@ -18,22 +15,16 @@
 #include "platform/host/filer/HsDbTdfFiler.h"
 #include "platform/host/ge/HsGeBoundBlock3d.h"
 
-#include <filesystem>
 #include <set>
 #include <tuple>
-#include <unistd.h>
 
 namespace {
 
-using Ids = std::vector<HsDbObjectId>;
-
-// The drawing with the relationship graph (the way back from members) and the module's services
-// (the available algorithms) running.
+// The drawing with the relationship graph (the way back from members) running.
 class ZyrAreaGroups : public ZyrAreaDrawing {
 protected:
     void SetUp() override {
         ZyrAreaDrawing::SetUp();
-        ZyrAreaCalculationTestModule::services();
         ASSERT_EQ(ZyrBaseServices::registerService(&ZyrAreaCalculationTestModule::client()),
                   Hsys::eSuccess);
         ZyrAreaCalculationAlgorithm::getAvailableAlgorithm(available);
@@ -51,30 +42,12 @@ protected:
                   Hsys::eSuccess);
         return id;
     }
-    HsDbObjectId addGroupStyle(const wchar_t* name) {
-        HsDbObjectId id;
-        auto* style = new ZyrDbAreaGroupStyle;
-        EXPECT_EQ(ZyrDictAreaGroupStyle(&database).addNewRecord(name, style, id), Hsys::eSuccess);
-        style->close();
-        return id;
-    }
-    template <class Question> static auto ask(const HsDbObjectId& group, Question question) {
-        HsDbObjectPointer<ZyrDbAreaGroup> opened(group, HsDb::kForRead);
-        return question(*opened.object());
-    }
     static Ids leafsOf(const HsDbObjectId& group) {
-        return ask(group, [](const ZyrDbAreaGroup& g) { return g.groupHandler()->leafs(); });
-    }
-    static std::vector<std::wstring> summaryOf(const ZyrImpAreaGroup& group) {
-        ZyrDesc desc(group.database());
-        group.summaryInfo(&desc);
-        std::vector<std::wstring> lines;
-        for (const ZyrRmCString& line : desc.lines())
-            lines.push_back(line.str());
-        return lines;
+        HsDbObjectPointer<ZyrDbAreaGroup> opened(group, HsDb::kForRead);
+        return std::as_const(*opened.object()).groupHandler()->leafs();
     }
 
-    std::vector<HsRxClass*> available;
+    Classes available;
 };
 
 // root holds K, L and the area a; K holds M and b; M holds c and a again; L holds d only.
@@ -83,49 +56,25 @@ TEST_F(ZyrAreaGroups, aDrawingFileGivesBackTheTreeWithItsMembersInOrder) {
     const HsDbObjectId M = addGroup(L"M", {}, {c, a}), K = addGroup(L"K", {M}, {b});
     const HsDbObjectId L = addGroup(L"L", {}, {d}), root = addGroup(L"root", {K, L}, {a});
     HsDbObjectPointer<ZyrDbAreaGroup>(L, HsDb::kForWrite)->groupHandler()->setNodeOwnership(2);
-
-    const std::filesystem::path file = std::filesystem::temp_directory_path() /
-                                       ("zyrgroup-" + std::to_string(::getpid()) + ".drawing");
-    ASSERT_EQ(database.saveAs(file.wstring().c_str()), Hsys::eSuccess);
-    HsDbDatabase loaded(HsDb::kEmptyDatabase);
-    ASSERT_EQ(loaded.readDrawingFile(file.wstring().c_str()), Hsys::eSuccess);
-    std::filesystem::remove(file);
-    const auto there = [&loaded](const Ids& ids) {
-        Ids found(ids.size());
-        for (std::size_t i = 0; i < ids.size(); ++i)
-            EXPECT_EQ(loaded.getHsDbObjectId(found[i], false, ids[i].handle()), Hsys::eSuccess);
-        return found;
-    };
+    const std::unique_ptr<HsDbDatabase> loaded = reloaded();
     const struct {
         HsDbObjectId group;
-        Ids nodes, leafs, nodesBelow, leafsBelow;
+        Ids nodes, leafs, leafsBelow;
         unsigned short mode;
-    } groups[] = {{root, {K, L}, {a}, {K, L, M}, {a, b, c, a, d}, 3},
-                  {K, {M}, {b}, {M}, {b, c, a}, 3},
-                  {L, {}, {d}, {}, {d}, 2}};
+    } groups[] = {{root, {K, L}, {a}, {a, b, c, a, d}, 3}, {L, {}, {d}, {d}, 2}};
     for (const auto& g : groups) {
-        HsDbObjectPointer<ZyrDbAreaGroup> group(there({g.group})[0], HsDb::kForRead);
+        HsDbObjectPointer<ZyrDbAreaGroup> group(there(*loaded, {g.group})[0], HsDb::kForRead);
         ASSERT_TRUE(group);
         const ZyrDbAreaGroup& loadedGroup = *group.object();
         const ZyrGroupHandler& handler = *loadedGroup.groupHandler();
-        Ids nodesBelow, leafsBelow;
-        EXPECT_EQ(handler.nodes(nodesBelow), Hsys::eSuccess);
+        Ids leafsBelow;
         EXPECT_EQ(handler.leafs(leafsBelow), Hsys::eSuccess);
-        EXPECT_EQ(
-            std::tuple(handler.nodes(), handler.leafs(), nodesBelow, leafsBelow),
-            std::tuple(there(g.nodes), there(g.leafs), there(g.nodesBelow), there(g.leafsBelow)))
-            << g.group;
-        EXPECT_EQ(handler.nodeOwnership(), g.mode);
-        for (const HsDbObjectId& id : {a, b, c, d, M, K, L, root}) {
-            const HsDbObjectId loadedId = there({id})[0];
-            EXPECT_EQ(std::pair(handler.hasNode(loadedId), handler.hasLeaf(loadedId)),
-                      std::pair(std::ranges::count(g.nodesBelow, id) > 0,
-                                std::ranges::count(g.leafsBelow, id) > 0))
-                << g.group << " asked for " << id;
-        }
+        EXPECT_EQ(std::tuple(handler.nodes(), handler.leafs(), leafsBelow, handler.nodeOwnership()),
+                  std::tuple(there(*loaded, g.nodes), there(*loaded, g.leafs),
+                             there(*loaded, g.leafsBelow), g.mode));
         EXPECT_EQ(loadedGroup.algorithms().items(), available) << "the classes by their names";
         EXPECT_EQ(loadedGroup.styleId(),
-                  there({ZyrDictAreaGroupStyle::getStandardAreaGroupStyle(&database)})[0])
+                  there(*loaded, {ZyrDictAreaGroupStyle::getStandardAreaGroupStyle(&database)})[0])
             << "the standard group style, given when the group entered the drawing";
     }
 }
@@ -234,39 +183,22 @@ TEST_F(ZyrAreaGroups, theOldTextFormReplacesListsAndNameWhateverTheStatus) {
 TEST_F(ZyrAreaGroups, extentsTakeTheLiveDirectAreasOnly) {
     const HsDbObjectId near = area(L"near", 1, 2), far = area(L"far", 10, -3);
     const HsDbObjectId gone = area(L"gone", 100, 100), deep = area(L"deep", -50, -50);
-    const HsDbObjectId inner = addGroup(L"inner", {}, {deep});
-    const HsDbObjectId outer = addGroup(L"outer", {inner}, {near, far, gone});
-    const HsDbObjectId groupsOnly = addGroup(L"groups only", {inner});
+    const HsDbObjectId outer =
+        addGroup(L"outer", {addGroup(L"inner", {}, {deep})}, {near, far, gone});
     erase(gone);
-    const struct {
-        HsDbObjectId group;
-        HsGePoint3d lowest, highest;
-    } cases[] = {{outer, {1, -3, 0}, {12, 3, 1}}, {groupsOnly, {}, {}}};
-    // The block of the empty box, whatever the block makes of its corners.
-    HsGePoint3d emptyLowest, emptyHighest;
-    HsGeBoundBlock3d()
-        .set(ZyrGeBoundBox3d().minPoint(), ZyrGeBoundBox3d().maxPoint())
-        .getMinMaxPoints(emptyLowest, emptyHighest);
-    for (const auto& c : cases) {
-        HsGeBoundBlock3d block;
-        ask(c.group, [&](const ZyrDbAreaGroup& g) {
-            EXPECT_EQ(g.areaGroupImp()->getLocalExtents(block), Hsys::eNotImplemented);
-            EXPECT_EQ(g.areaGroupImp()->getWorldExtents(block), Hsys::eSuccess);
-            return 0;
-        });
-        HsGePoint3d lowest, highest;
-        block.getMinMaxPoints(lowest, highest);
-        const bool empty = c.group == groupsOnly;
-        const auto xyz = [](const HsGePoint3d& p) { return std::tuple(p.x, p.y, p.z); };
-        EXPECT_EQ(xyz(lowest), xyz(empty ? emptyLowest : c.lowest)) << c.group;
-        EXPECT_EQ(xyz(highest), xyz(empty ? emptyHighest : c.highest)) << c.group;
-    }
+    HsDbObjectPointer<ZyrDbAreaGroup> group(outer, HsDb::kForRead);
+    HsGeBoundBlock3d block;
+    EXPECT_EQ(group->areaGroupImp()->getLocalExtents(block), Hsys::eNotImplemented);
+    ASSERT_EQ(group->areaGroupImp()->getWorldExtents(block), Hsys::eSuccess);
+    HsGePoint3d lowest, highest;
+    block.getMinMaxPoints(lowest, highest);
+    EXPECT_EQ(lowest, HsGePoint3d(1, -3, 0));
+    EXPECT_EQ(highest, HsGePoint3d(12, 3, 1));
 }
 
 TEST_F(ZyrAreaGroups, copiesReferencesAndSamples) {
-    const HsDbObjectId a = area(L"a"), child = addGroup(L"child");
-    const HsDbObjectId names = addAreaStyle(L"N");
-    const HsDbObjectId office = addGroupStyle(L"Office");
+    const HsDbObjectId a = area(L"a"), child = addGroup(L"child"), names = addAreaStyle(L"N");
+    const HsDbObjectId office = addRecord<ZyrDictAreaGroupStyle, ZyrDbAreaGroupStyle>(L"Office");
     HsDbObjectPointer<ZyrDbAreaGroup> source(addGroup(L"source", {child}, {a}), HsDb::kForWrite);
     ASSERT_EQ(source->setStyleId(office), Hsys::eSuccess);
     EXPECT_EQ(source->setStyleId(HsDbObjectId::kNull), Hsys::eNullId);
@@ -276,17 +208,14 @@ TEST_F(ZyrAreaGroups, copiesReferencesAndSamples) {
 
     ZyrImpAreaGroup copy;
     ASSERT_EQ(copy.copyFrom(source->areaGroupImp()), Hsys::eSuccess);
-    EXPECT_EQ(copy.name(), L"source");
-    EXPECT_EQ(copy.styleId(), office);
-    EXPECT_EQ(copy.proposalNamesId(), names);
-    EXPECT_EQ(copy.algorithms().items(), std::vector{available.front()});
-    EXPECT_EQ(copy.groupHandler()->nodes(), Ids{child});
-    EXPECT_EQ(copy.groupHandler()->leafs(), Ids{a});
+    const ZyrGroupHandler& handler = *std::as_const(copy).groupHandler();
+    EXPECT_EQ(std::tuple(copy.name().str(), copy.styleId(), copy.proposalNamesId(),
+                         copy.algorithms().items(), handler.nodes(), handler.leafs()),
+              std::tuple(L"source", office, names, Classes{available.front()}, Ids{child}, Ids{a}));
     ZyrImpArea notAGroup;
     EXPECT_EQ(copy.copyFrom(&notAGroup), Hsys::eBadArgument);
     ASSERT_EQ(copy.copyFrom(&copy), Hsys::eSuccess);
     EXPECT_EQ(copy.algorithms().count(), 0) << "emptied before it was added to itself";
-    EXPECT_EQ(copy.name(), L"source");
 
     ZyrObjReferenceMap references;
     ASSERT_EQ(source->areaGroupImp()->getReferencedObjects(references), Hsys::eSuccess);
@@ -308,7 +237,8 @@ TEST_F(ZyrAreaGroups, copiesReferencesAndSamples) {
 // Counts run in from earlier objects of the same audit: the group adds its running total plus
 // one, where an area adds one.
 TEST_F(ZyrAreaGroups, anAuditCountsBadProposalNamesByTheRunningTotal) {
-    const HsDbObjectId names = addAreaStyle(L"N"), groupStyle = addGroupStyle(L"G");
+    const HsDbObjectId names = addAreaStyle(L"N");
+    const HsDbObjectId groupStyle = addRecord<ZyrDictAreaGroupStyle, ZyrDbAreaGroupStyle>(L"G");
     const HsDbObjectId group = addGroup(L"g");
     {
         HsDbObjectPointer<ZyrDbAreaGroup> opened(group, HsDb::kForWrite);
@@ -317,6 +247,8 @@ TEST_F(ZyrAreaGroups, anAuditCountsBadProposalNamesByTheRunningTotal) {
     }
     erase(names);
     erase(groupStyle);
+    const HsDbObjectId good = area(L"good"), gone = area(L"gone");
+    erase(gone);
     for (const bool fix : {false, true}) {
         HsDbObjectPointer<ZyrDbAreaGroup> opened(group, fix ? HsDb::kForWrite : HsDb::kForRead);
         HsDbAuditInfo info(fix);
@@ -326,19 +258,14 @@ TEST_F(ZyrAreaGroups, anAuditCountsBadProposalNamesByTheRunningTotal) {
         EXPECT_EQ(info.numFixes(), 0) << "no standard proposal names to take";
         EXPECT_EQ(opened->proposalNamesId(), fix ? HsDbObjectId::kNull : names);
         EXPECT_EQ(opened->styleId(), groupStyle) << "a bad group style is not repaired";
-    }
 
-    const HsDbObjectId good = area(L"good"), gone = area(L"gone");
-    erase(gone);
-    for (const bool fix : {false, true}) {
         Ids ids{good, gone, group};
-        HsDbAuditInfo info(fix);
-        info.errorsFound(1);
-        info.errorsFixed(1);
-        HsDbObjectPointer<ZyrDbAreaGroup> opened(group, HsDb::kForRead);
-        opened->areaGroupImp()->auditObjectIds(opened.object(), &info, ids, ZyrDbArea::desc());
-        EXPECT_EQ(info.numErrors(), 1 + 2 + 4) << "1, then 1 + 2, then 3 + 4";
-        EXPECT_EQ(info.numFixes(), fix ? 1 + 3 : 1);
+        HsDbAuditInfo members(fix);
+        members.errorsFound(1);
+        members.errorsFixed(1);
+        opened->areaGroupImp()->auditObjectIds(opened.object(), &members, ids, ZyrDbArea::desc());
+        EXPECT_EQ(members.numErrors(), 1 + 2 + 4) << "1, then 1 + 2, then 3 + 4";
+        EXPECT_EQ(members.numFixes(), fix ? 1 + 3 : 1);
         EXPECT_EQ(ids, fix ? Ids{good} : (Ids{good, gone, group}));
     }
 }
@@ -351,8 +278,10 @@ TEST_F(ZyrAreaGroups, theSummaryCountsLiveMembersDirectAndBelow) {
     erase(gone);
     erase(erasedGroup);
     HsDbObjectPointer<ZyrDbAreaGroup> group(outer, HsDb::kForRead);
-    EXPECT_EQ(summaryOf(*group->areaGroupImp()),
-              (std::vector<std::wstring>{
+    ZyrDesc desc(&database);
+    group->areaGroupImp()->summaryInfo(&desc);
+    EXPECT_EQ(desc.lines(),
+              (std::vector<ZyrRmCString>{
                   L"Name: Floor 1", L"Area Group Style: Standard", L"Members: Area Group, Area",
                   L"Calculations: Area", L"Calculations: Perimeter", L"Proposal names: (none)",
                   L"Areas directly in the group: 1", L"Groups directly below: 1",
@@ -362,22 +291,23 @@ TEST_F(ZyrAreaGroups, theSummaryCountsLiveMembersDirectAndBelow) {
                   L"Net perimeter: 12.00 m"}));
 }
 
-// An object is modified by the write that records a redraw; the open mode is put back.
+// An object is modified by the write that records a redraw; the open mode is put back, and
+// another reader keeps it from an upgrade.
 TEST_F(ZyrAreaGroups, aRedrawIsRecordedInTheOpenModeItFinds) {
     const HsDbObjectId group = addGroup(L"g"), erased = addGroup(L"erased");
     erase(erased);
-    for (const auto& [id, mode, modified] :
-         {std::tuple(group, HsDb::kForRead, true), std::tuple(group, HsDb::kForWrite, true),
-          std::tuple(erased, HsDb::kForRead, false)}) {
-        HsDbObjectPointer<ZyrDbAreaGroup> opened(id, mode, true);
+    for (const auto& [id, mode, modified, readers] :
+         {std::tuple(group, HsDb::kForRead, true, 1), std::tuple(group, HsDb::kForWrite, true, 1),
+          std::tuple(erased, HsDb::kForRead, false, 1),
+          std::tuple(group, HsDb::kForRead, false, 2)}) {
+        HsDbObjectPointer<ZyrDbAreaGroup> opened(id, mode, true), other;
+        if (readers == 2)
+            other.open(id, HsDb::kForRead);
         opened->recordForRegen();
         EXPECT_EQ(std::pair(opened->isWriteEnabled(), opened->isModified()),
                   std::pair(mode == HsDb::kForWrite, modified))
-            << id;
+            << id << " " << readers;
     }
-    HsDbObjectPointer<ZyrDbAreaGroup> first(group, HsDb::kForRead), second(group, HsDb::kForRead);
-    first->recordForRegen();
-    EXPECT_FALSE(first->isModified()) << "another reader keeps it from an upgrade";
 }
 
 TEST_F(ZyrAreaGroups, anAreaLeavesItsGroupsOnlyForAnotherClass) {
@@ -396,21 +326,6 @@ TEST_F(ZyrAreaGroups, anAreaLeavesItsGroupsOnlyForAnotherClass) {
         EXPECT_EQ(leafsOf(first), byArea ? (Ids{hall, kept}) : Ids{kept}) << byArea;
         EXPECT_EQ(leafsOf(second), byArea ? (Ids{kept, hall}) : Ids{kept}) << byArea;
     }
-}
-
-TEST_F(ZyrAreaGroups, classesRegisterAsTheClassTableHasThem) {
-    EXPECT_STREQ(ZyrDbAreaGroup::desc()->recordName(), L"ZYR_AREAGROUP");
-    EXPECT_EQ(ZyrDbAreaGroup::desc()->proxyFlags(), 893);
-    EXPECT_EQ(ZyrImpAreaGroup::desc()->proxyFlags(), 80);
-    EXPECT_EQ(ZyrImpAreaGroup::desc()->myParent(), ZyrImpGeo::desc());
-    ZyrRmCString shown;
-    ZyrDecoratorManager::displayName(ZyrDbAreaGroup::desc(), shown);
-    EXPECT_EQ(shown, L"Area Group");
-    EXPECT_EQ(ZyrDictAreaGroupStyle(&database).objectClass(), ZyrDbAreaGroup::desc());
-
-    std::unique_ptr<HsRxObject> compSpec(ZyrCompSpecAreaGroup::desc()->create());
-    ASSERT_EQ(compSpec->isA(), ZyrCompSpecAreaGroup::desc());
-    EXPECT_EQ(static_cast<ZyrCompSpecAreaGroup*>(compSpec.get())->worksWith(), ZyrDbAreaGroup::desc());
 }
 
 } // namespace

@@ -4,11 +4,10 @@
 
 #include "areacalc/calc/ZyrAreaDbOperations.h"
 #include "areacalc/objects/ZyrCompSpecTemplate.h"
+#include "platform/base/obj/ZyrImpGeo.h"
 #include "platform/host/db/HsDbProxyObject.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
 #include "platform/host/filer/HsDbTdfFiler.h"
-#include "platform/host/rx/HsRxDictionary.h"
-#include "platform/host/rx/HsRxSysRegistry.h"
 
 namespace {
 
@@ -17,36 +16,38 @@ using ZyrDbPairs = ZyrAreaDrawing;
 TEST_F(ZyrDbPairs, classesRegisterAsTheClassTableHasThem) {
     const struct {
         HsRxClass* cls;
+        HsRxClass* parent;
         const wchar_t* recordName;
         int flags;
         const wchar_t* displayName;
-    } rows[] = {{ZyrDbArea::desc(), L"ZYR_AREA", 893, L"Area"},
-                {ZyrImpArea::desc(), L"", 80, L""},
-                {ZyrDbAreaGroupStyle::desc(), L"ZYR_ZYRDBAREAGROUPSTYLE", 129, L"Area Group Style"},
-                {ZyrDictAreaStyle::desc(), L"", 0, L"Area Styles"},
-                {ZyrCompSpecArea::desc(), L"", 80, L""}};
+    } rows[] = {
+        {ZyrDbArea::desc(), ZyrDbGeo::desc(), L"ZYR_AREA", 893, L"Area"},
+        {ZyrImpArea::desc(), ZyrImpGeo::desc(), L"", 80, L""},
+        {ZyrDbAreaGroup::desc(), ZyrDbGeo::desc(), L"ZYR_AREAGROUP", 893, L"Area Group"},
+        {ZyrImpAreaGroup::desc(), ZyrImpGeo::desc(), L"", 80, L""},
+        {ZyrDbAreaGroupStyle::desc(), nullptr, L"ZYR_ZYRDBAREAGROUPSTYLE", 129,
+         L"Area Group Style"},
+        {ZyrDictAreaStyle::desc(), nullptr, L"", 0, L"Area Styles"},
+        {ZyrCompSpecArea::desc(), nullptr, L"", 80, L""},
+    };
     for (const auto& row : rows) {
         ASSERT_NE(row.cls, nullptr);
         EXPECT_STREQ(row.cls->recordName(), row.recordName);
         EXPECT_EQ(row.cls->proxyFlags(), row.flags) << row.cls->name();
         EXPECT_EQ(row.cls->drawingVersion(), *row.recordName != L'\0' ? 23 : 0);
+        if (row.parent != nullptr) {
+            EXPECT_EQ(row.cls->myParent(), row.parent) << row.cls->name();
+        }
         ZyrRmCString shown;
         ZyrDecoratorManager::displayName(row.cls, shown);
         EXPECT_EQ(shown, row.displayName);
     }
-    EXPECT_EQ(ZyrDbArea::desc()->myParent(), ZyrDbGeo::desc());
     EXPECT_EQ(ZyrDbArea::rxInit(), ZyrDbArea::desc()) << "registering again gives the same class";
-}
-
-TEST_F(ZyrDbPairs, anotherClassUnderTheNameEndsTheProcess) {
-    EXPECT_DEATH(
-        {
-            static_cast<HsRxDictionary*>(hsrxSysRegistry()->at(kHsRxClassDictionary))
-                ->remove(L"ZyrDbArea");
-            newHsRxClass(L"ZyrDbArea", L"ZyrDbGeo", 893, nullptr);
-            ZyrDbArea::rxInit();
-        },
-        "Class mismatch");
+    EXPECT_EQ(ZyrDictAreaStyle(&database).objectClass(), ZyrDbArea::desc());
+    EXPECT_EQ(ZyrDictAreaGroupStyle(&database).objectClass(), ZyrDbAreaGroup::desc());
+    std::unique_ptr<HsRxObject> made(ZyrCompSpecAreaGroup::desc()->create());
+    ASSERT_EQ(made->isA(), ZyrCompSpecAreaGroup::desc());
+    EXPECT_EQ(static_cast<ZyrCompSpecAreaGroup*>(made.get())->worksWith(), ZyrDbAreaGroup::desc());
 }
 
 TEST_F(ZyrDbPairs, openPassesItsGatesInOrder) {

@@ -110,8 +110,6 @@ protected:
     void SetUp() override { ASSERT_EQ(ZyrBaseServices::registerService(&app), Hsys::eSuccess); }
     void TearDown() override {
         EXPECT_EQ(ZyrBaseServices::unRegisterService(&app), Hsys::eSuccess);
-        std::error_code ignored;
-        std::filesystem::remove(path, ignored);
     }
 
     HsDbObjectId add(HsDbObject* object) {
@@ -173,7 +171,6 @@ protected:
 
     ZyrAppHdx app{L"GroupHandlerTest80", nullptr, gExtension, L"GroupHandlerTest"};
     HsDbDatabase database;
-    std::filesystem::path path;
 };
 
 TEST_F(ZyrGroupHandlerTree, answersOverTheWholeTreeDepthFirst) {
@@ -293,11 +290,13 @@ TEST_F(ZyrGroupHandlerTree, findsOwnersAndObjectsThroughTheGraphBeforeAndAfterAD
               Hsys::eSuccess);
     EXPECT_EQ(objects, (Ids{t.R, t.A, t.B, t.C}));
 
-    path = std::filesystem::temp_directory_path() /
-           ("ZyrGroupHandlerTest-" + std::to_string(getpid()) + ".drawing");
-    ASSERT_EQ(database.saveAs(path.wstring().c_str()), Hsys::eSuccess);
+    const std::wstring path = (std::filesystem::temp_directory_path() /
+                               ("ZyrGroupHandlerTest-" + std::to_string(getpid()) + ".drawing"))
+                                  .wstring();
+    ASSERT_EQ(database.saveAs(path.c_str()), Hsys::eSuccess);
     HsDbDatabase loaded(HsDb::kEmptyDatabase);
-    ASSERT_EQ(loaded.readDrawingFile(path.wstring().c_str()), Hsys::eSuccess);
+    ASSERT_EQ(loaded.readDrawingFile(path.c_str()), Hsys::eSuccess);
+    std::filesystem::remove(path);
     const auto there = [&](const Ids& ids) {
         Ids mapped;
         for (const HsDbObjectId& id : ids)
