@@ -50,6 +50,12 @@ bool ZyrACFunctional::lessPairSecond(const NamedId& first, const NamedId& second
     return std::wcscmp(first.second.GetString(), second.second.GetString()) < 0;
 }
 
+void ZyrACFunctional::sortByName(std::vector<NamedId>& named) {
+    // Members are often kept in the order of their names; then one look over them is enough.
+    if (!std::is_sorted(named.begin(), named.end(), lessPairSecond))
+        std::sort(named.begin(), named.end(), lessPairSecond);
+}
+
 template <class T> void ZyrACFunctional::sortNamedObjects(std::vector<HsDbObjectId>& ids, T*) {
     std::vector<NamedId> named;
     named.reserve(ids.size());
@@ -60,7 +66,7 @@ template <class T> void ZyrACFunctional::sortNamedObjects(std::vector<HsDbObject
         named.emplace_back(id, object->name());
         (void)object->close();
     }
-    std::sort(named.begin(), named.end(), lessPairSecond);
+    sortByName(named);
     ids.clear();
     for (const NamedId& entry : named)
         ids.push_back(entry.first);
@@ -257,8 +263,8 @@ void ZyrAreaCalculationEngine::sortInput(std::vector<HsDbObjectId>& ids) {
         else if (const ZyrDbAreaGroup* group = ZyrDbAreaGroup::cast(entity))
             groups.emplace_back(id, group->name());
     }
-    std::sort(groups.begin(), groups.end(), ZyrACFunctional::lessPairSecond);
-    std::sort(areas.begin(), areas.end(), ZyrACFunctional::lessPairSecond);
+    ZyrACFunctional::sortByName(groups);
+    ZyrACFunctional::sortByName(areas);
     ids.clear();
     for (const auto* list : {&groups, &areas})
         for (const auto& entry : *list)

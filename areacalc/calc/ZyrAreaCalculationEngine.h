@@ -29,6 +29,8 @@ struct ZyrACFunctional {
     // By wide-character value: case sensitive and independent of any locale, so that a plan
     // lists the same on every machine.
     static bool lessPairSecond(const NamedId& first, const NamedId& second);
+    // By lessPairSecond; equal names keep no particular order.
+    static void sortByName(std::vector<NamedId>& named);
     // Keeps the ids that open as a T, sorted by name; the pointer only selects T (ZyrDbArea or
     // ZyrDbAreaGroup).
     template <class T> static void sortNamedObjects(std::vector<HsDbObjectId>& ids, T*);
