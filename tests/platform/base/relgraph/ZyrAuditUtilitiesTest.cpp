@@ -109,6 +109,11 @@ TEST_F(ZyrAuditUtilitiesOn, aListIsCountedAndRepairedInOrderOnlyWhenAsked) {
                   c.bad);
         EXPECT_EQ(ids, c.after);
     }
+    std::vector<HsDbObjectId> oneBad = {good, missing};
+    EXPECT_EQ(ZyrAuditUtilities::verifySymbolReferences(owner.object(), oneBad,
+                                                        ZyrDbSampleRecord::desc(), 0, 0, true),
+              1);
+    EXPECT_EQ(oneBad, std::vector<HsDbObjectId>{good}) << "a single bad reference goes too";
 }
 
 } // namespace
