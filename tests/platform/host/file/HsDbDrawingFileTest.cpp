@@ -6,8 +6,10 @@
 #include "tests/platform/host/db/HsDbTestGadget.h"
 
 #include <gtest/gtest.h>
+
 #include <sqlite3.h>
 
+#include <algorithm>
 #include <chrono>
 #include <csignal>
 #include <filesystem>
@@ -229,8 +231,16 @@ TEST_F(HsDbDrawingFileTest, aFailedSaveLeavesThePreviousFileAsItWas) {
     open.close();
     EXPECT_EQ(db.saveAs((directory / "no-such-dir" / "plan.zyr").wstring().c_str()),
               Hsys::eFileAccessError);
+    // A folder holds the name: the new file is written in full and then cannot take its place.
+    const fs::path taken = directory / "taken.zyr";
+    fs::create_directories(taken / "inside");
+    EXPECT_EQ(db.saveAs(taken.wstring().c_str()), Hsys::eFileAccessError);
     EXPECT_EQ(rowsOf(path), before);
-    EXPECT_EQ(std::distance(fs::directory_iterator(directory), fs::directory_iterator()), 1)
+    std::vector<fs::path> left;
+    for (const fs::directory_entry& entry : fs::directory_iterator(directory))
+        left.push_back(entry.path().filename());
+    std::sort(left.begin(), left.end());
+    EXPECT_EQ(left, (std::vector<fs::path>{path.filename(), taken.filename()}))
         << "no temporary file is left behind";
 }
 
