@@ -20,31 +20,26 @@ TEST_F(ZyrAreaCalculationAlgorithmTest, recordsCarryTheValueOfAnAreaAndZeroForAG
         ZyrAreaCalculationAlgorithm::*)(HsDbEntity*, const ZyrAreaCalculationBitmapCreator*) const;
     const ZyrAreaCalculationAreaAlgorithm areaCalc{};
     const ZyrAreaCalculationPerimeterAlgorithm perimeterCalc{};
-    const struct {
-        const ZyrAreaCalculationAlgorithm& algorithm;
-        Make make;
-        const wchar_t* className;
-        const wchar_t* grossName;
-        const wchar_t* netName;
-        double value;
-    } cases[] = {
-        {areaCalc, &ZyrAreaCalculationAlgorithm::areaNodeData, L"ZyrAreaCalculationAreaAlgorithm",
-         L"Area", L"Net area", 11},
-        {areaCalc, &ZyrAreaCalculationAlgorithm::areaGroupNodeData,
-         L"ZyrAreaCalculationAreaAlgorithm", L"Area", L"Net area", 0},
-        {perimeterCalc, &ZyrAreaCalculationAlgorithm::areaNodeData,
-         L"ZyrAreaCalculationPerimeterAlgorithm", L"Perimeter", L"Net perimeter", 18},
-        {perimeterCalc, &ZyrAreaCalculationAlgorithm::areaGroupNodeData,
-         L"ZyrAreaCalculationPerimeterAlgorithm", L"Perimeter", L"Net perimeter", 0},
-    };
-    for (const auto& c : cases) {
-        std::unique_ptr<ZyrCalculationNodeData> data((c.algorithm.*c.make)(area.object(), nullptr));
+    const std::tuple<const ZyrAreaCalculationAlgorithm&, Make, const wchar_t*, const wchar_t*,
+                     const wchar_t*, double>
+        cases[] = {
+            {areaCalc, &ZyrAreaCalculationAlgorithm::areaNodeData,
+             L"ZyrAreaCalculationAreaAlgorithm", L"Area", L"Net area", 11},
+            {areaCalc, &ZyrAreaCalculationAlgorithm::areaGroupNodeData,
+             L"ZyrAreaCalculationAreaAlgorithm", L"Area", L"Net area", 0},
+            {perimeterCalc, &ZyrAreaCalculationAlgorithm::areaNodeData,
+             L"ZyrAreaCalculationPerimeterAlgorithm", L"Perimeter", L"Net perimeter", 18},
+            {perimeterCalc, &ZyrAreaCalculationAlgorithm::areaGroupNodeData,
+             L"ZyrAreaCalculationPerimeterAlgorithm", L"Perimeter", L"Net perimeter", 0},
+        };
+    for (const auto& [algorithm, make, className, grossName, netName, value] : cases) {
+        std::unique_ptr<ZyrCalculationNodeData> data((algorithm.*make)(area.object(), nullptr));
         EXPECT_EQ(dynamic_cast<ZyrDecomposedCalculationNodeData*>(data.get()), nullptr);
         EXPECT_EQ(std::tuple(data->objectId, data->algorithmClassName.str(), data->grossName.str(),
                              data->netName.str()),
-                  std::tuple(id, std::wstring(c.className), std::wstring(c.grossName),
-                             std::wstring(c.netName)));
-        EXPECT_NEAR(data->grossValue, c.value, 1e-12) << c.className;
+                  std::tuple(id, std::wstring(className), std::wstring(grossName),
+                             std::wstring(netName)));
+        EXPECT_NEAR(data->grossValue, value, 1e-12) << className;
         EXPECT_EQ(data->netValue, data->grossValue);
     }
 

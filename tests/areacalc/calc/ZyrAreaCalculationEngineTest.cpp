@@ -90,30 +90,28 @@ TEST_F(ZyrAreaCalculationEngineTest, groupSumsMembersNetAndThenRunsItsOwnModifie
 
     const ZyrCalculationNode& g = *stream.roots()[0];
     ASSERT_EQ(g.children.size(), 2u);
-    const struct {
-        const ZyrCalculationNode& node;
-        double areaGross, areaNet, perimeterGross;
-        std::vector<std::pair<double, double>> steps;
-    } cases[] = {
-        {*g.children[0], 20, 9, 18, {{20, 18}, {18, 9}}}, // Large
-        {*g.children[1], 10, 8, 14, {{10, 8}}},           // Small
-        {g, 30, 8.5, 32, {{17, 8.5}}},
-    };
-    for (const auto& c : cases) {
-        const ZyrCalculationNodeData* areaData = data(c.node, areaAlgorithm());
-        const ZyrCalculationNodeData* perimeterData = data(c.node, perimeterAlgorithm());
+    const std::tuple<const ZyrCalculationNode&, double, double, double,
+                     std::vector<std::pair<double, double>>>
+        cases[] = {
+            {*g.children[0], 20, 9, 18, {{20, 18}, {18, 9}}}, // Large
+            {*g.children[1], 10, 8, 14, {{10, 8}}},           // Small
+            {g, 30, 8.5, 32, {{17, 8.5}}},
+        };
+    for (const auto& [node, areaGross, areaNet, perimeterGross, steps] : cases) {
+        const ZyrCalculationNodeData* areaData = data(node, areaAlgorithm());
+        const ZyrCalculationNodeData* perimeterData = data(node, perimeterAlgorithm());
         ASSERT_NE(areaData, nullptr);
         ASSERT_NE(perimeterData, nullptr);
-        EXPECT_NEAR(areaData->grossValue, c.areaGross, 1e-12) << nameOf(c.node);
-        EXPECT_NEAR(areaData->netValue, c.areaNet, 1e-12) << nameOf(c.node);
+        EXPECT_NEAR(areaData->grossValue, areaGross, 1e-12) << nameOf(node);
+        EXPECT_NEAR(areaData->netValue, areaNet, 1e-12) << nameOf(node);
         // The modifiers do not list the perimeter: no step, net equals gross.
-        EXPECT_NEAR(perimeterData->grossValue, c.perimeterGross, 1e-12) << nameOf(c.node);
+        EXPECT_NEAR(perimeterData->grossValue, perimeterGross, 1e-12) << nameOf(node);
         EXPECT_EQ(perimeterData->netValue, perimeterData->grossValue);
         EXPECT_TRUE(perimeterData->modifierBlocks.empty());
-        ASSERT_EQ(areaData->modifierBlocks.size(), c.steps.size()) << nameOf(c.node);
-        for (size_t i = 0; i < c.steps.size(); ++i) {
-            EXPECT_NEAR(areaData->modifierBlocks[i].beforeValue, c.steps[i].first, 1e-12);
-            EXPECT_NEAR(areaData->modifierBlocks[i].afterValue, c.steps[i].second, 1e-12);
+        ASSERT_EQ(areaData->modifierBlocks.size(), steps.size()) << nameOf(node);
+        for (size_t i = 0; i < steps.size(); ++i) {
+            EXPECT_NEAR(areaData->modifierBlocks[i].beforeValue, steps[i].first, 1e-12);
+            EXPECT_NEAR(areaData->modifierBlocks[i].afterValue, steps[i].second, 1e-12);
             EXPECT_EQ(areaData->modifierBlocks[i].beforeName, L"_AREA_VALUE_");
         }
     }

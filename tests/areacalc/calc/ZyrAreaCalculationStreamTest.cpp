@@ -62,8 +62,7 @@ TEST_F(ZyrAreaCalculationStreamTest, lookupsAnswerWhatASearchFromTheFrontAnswers
             const int expectedHeader = searchFromTheFront(stream.nodeHeaderVector(), id(handle));
             const int expectedModifier =
                 searchFromTheFront(stream.modifierDataVector(), id(handle));
-            int headerIndex = -1;
-            int modifierIndex = -1;
+            int headerIndex = -1, modifierIndex = -1;
             EXPECT_EQ(stream.hasNodeHeaderFor(id(handle), headerIndex), expectedHeader >= 0);
             EXPECT_EQ(stream.hasModifierDataFor(id(handle), modifierIndex), expectedModifier >= 0);
             EXPECT_EQ(headerIndex, expectedHeader) << handle;
@@ -89,14 +88,11 @@ TEST_F(ZyrAreaCalculationStreamTest, objectPushedTwiceSharesItsHeaderButNotItsDa
     EXPECT_NE(stream.nodeDataAt(first, 0), stream.nodeDataAt(second, 0));
 
     // Node data are found by object and by the exact algorithm name, first in table order.
-    const struct {
-        const wchar_t* algorithm;
-        int index;
-    } cases[] = {{L"Area", 0}, {L"Perimeter", 2}, {L"area", -1}, {L"Area ", -1}, {L"Are", -1}};
-    for (const auto& c : cases) {
+    for (const auto& [algorithm, expected] :
+         {std::pair(L"Area", 0), {L"Perimeter", 2}, {L"area", -1}, {L"Area ", -1}, {L"Are", -1}}) {
         index = -1;
-        EXPECT_EQ(stream.hasNodeDataFor(id(7), c.algorithm, index), c.index >= 0) << c.algorithm;
-        EXPECT_EQ(index, c.index) << c.algorithm;
+        EXPECT_EQ(stream.hasNodeDataFor(id(7), algorithm, index), expected >= 0) << algorithm;
+        EXPECT_EQ(index, expected) << algorithm;
     }
     EXPECT_FALSE(stream.hasNodeDataFor(id(8), L"Area", index));
 }

@@ -39,14 +39,9 @@ protected:
 };
 
 TEST_F(ZyrAreaCalculationWhiteBoardTest, attachAndDetachKeepOrderAndAnswerTheirStatuses) {
-    EXPECT_EQ(board.detachAlgorithm(area), Hsys::eSuccess) << "nothing attached";
-    EXPECT_EQ(board.detachAlgorithm(nullptr), Hsys::eSuccess);
-    const struct {
-        bool attach;
-        HsRxClass* cls;
-        Hsys::ErrorStatus status;
-        Classes after;
-    } steps[] = {
+    const std::tuple<bool, HsRxClass*, Hsys::ErrorStatus, Classes> steps[] = {
+        {false, area, Hsys::eSuccess, {}},
+        {false, nullptr, Hsys::eSuccess, {}},
         {true, perimeter, Hsys::eSuccess, {perimeter}},
         {true, area, Hsys::eSuccess, {perimeter, area}},
         {true, area, Hsys::eDuplicateName, {perimeter, area}},
@@ -55,13 +50,11 @@ TEST_F(ZyrAreaCalculationWhiteBoardTest, attachAndDetachKeepOrderAndAnswerTheirS
         {false, ZyrAreaCalculationAlgorithm::desc(), Hsys::eNameNotFound, {perimeter, area}},
         {false, perimeter, Hsys::eSuccess, {area}},
         {true, perimeter, Hsys::eSuccess, {area, perimeter}},
-        {false, nullptr, Hsys::eSuccess, {}},
-    };
-    for (const auto& step : steps) {
-        EXPECT_EQ(step.attach ? board.attachAlgorithm(step.cls) : board.detachAlgorithm(step.cls),
-                  step.status)
-            << (step.cls != nullptr ? step.cls->name() : L"null");
-        EXPECT_EQ(attached(), step.after);
+        {false, nullptr, Hsys::eSuccess, {}}};
+    for (const auto& [attach, cls, status, after] : steps) {
+        EXPECT_EQ(attach ? board.attachAlgorithm(cls) : board.detachAlgorithm(cls), status)
+            << (cls != nullptr ? cls->name() : L"null");
+        EXPECT_EQ(attached(), after);
     }
     EXPECT_FALSE(board.imp()->valid()) << "attaching needs no valid board";
 }

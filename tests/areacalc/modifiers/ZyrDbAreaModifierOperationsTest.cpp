@@ -83,13 +83,7 @@ TEST_F(ZyrModifierAttachment, missingEntitiesOverridesAndIdsHaveTheirStatuses) {
     const HsDbObjectId null;
     double value = 1;
     Ids ids;
-    const struct {
-        const char* what;
-        HsDb::OpenMode mode;
-        Operation operation;
-        Status status;
-        int overrides;
-    } cases[] = {
+    const std::tuple<const char*, HsDb::OpenMode, Operation, Status, int> cases[] = {
         {"append to no entity", HsDb::kForWrite,
          [&](ZyrDbArea*) { return Ops::appendModifier(nullptr, half); }, Hsys::eNotOpenForWrite, 0},
         {"append to a read entity", HsDb::kForRead,
@@ -108,13 +102,13 @@ TEST_F(ZyrModifierAttachment, missingEntitiesOverridesAndIdsHaveTheirStatuses) {
         {"apply for no algorithm", HsDb::kForRead,
          [&](ZyrDbArea* a) { return Ops::applyTo(a, nullptr, value); }, Hsys::eNullPointer, 0},
     };
-    for (const auto& c : cases) {
+    for (const auto& [what, mode, operation, status, overrides] : cases) {
         const HsDbObjectId room = addRoom();
         {
-            HsDbObjectPointer<ZyrDbArea> area(room, c.mode);
-            EXPECT_EQ(c.operation(area.object()), c.status) << c.what;
+            HsDbObjectPointer<ZyrDbArea> area(room, mode);
+            EXPECT_EQ(operation(area.object()), status) << what;
         }
-        EXPECT_EQ(overridesOf(room), c.overrides) << c.what;
+        EXPECT_EQ(overridesOf(room), overrides) << what;
     }
 }
 
@@ -122,22 +116,18 @@ TEST_F(ZyrModifierAttachment, removalTakesTheFirstOfEqualIdsAndNeverLeavesAnEmpt
     const HsDbObjectId room = addRoom({half, balcony, half});
     EXPECT_EQ(appliedTo(room, areaAlgorithm(), 12), 0.75) << "an id that stands twice acts twice";
     const HsDbObjectId null;
-    const struct {
-        HsDbObjectId id;
-        Status status;
-        Ids left;
-    } steps[] = {
+    const std::tuple<HsDbObjectId, Status, Ids> steps[] = {
         {half, Hsys::eSuccess, {balcony, half}}, {half, Hsys::eSuccess, {balcony}},
         {half, Hsys::eNameNotFound, {balcony}},  {balcony, Hsys::eSuccess, {}},
         {balcony, Hsys::eNullPointer, {}},
     };
-    for (const auto& step : steps) {
+    for (const auto& [id, status, left] : steps) {
         {
             HsDbObjectPointer<ZyrDbArea> area(room, HsDb::kForWrite);
-            EXPECT_EQ(Ops::removeModifier(area.object(), step.id), step.status);
+            EXPECT_EQ(Ops::removeModifier(area.object(), id), status);
         }
-        EXPECT_EQ(modifiersOf(room), step.left);
-        EXPECT_EQ(overridesOf(room), step.left.empty() ? 0 : 1);
+        EXPECT_EQ(modifiersOf(room), left);
+        EXPECT_EQ(overridesOf(room), left.empty() ? 0 : 1);
     }
 
     HsDbObjectPointer<ZyrDbArea> area(room, HsDb::kForWrite);
@@ -159,20 +149,15 @@ TEST_F(ZyrModifierAttachment, applyToGoesOnPastAFailureAndReportsTheLastEvaluati
     }
     const HsDbObjectId gone = addModifier(L"Gone", L"_AREA_VALUE_*100");
     HsDbObjectPointer<ZyrDbAreaModifier>(gone, HsDb::kForWrite)->erase();
-    const struct {
-        const char* what;
-        Ids chain;
-        Status status;
-        double value;
-    } cases[] = {
+    const std::tuple<const char*, Ids, Status, double> cases[] = {
         {"failure first", {failing, half}, Hsys::eSuccess, 6},
         {"failure last", {half, failing}, Hsys::eInvalidInput, 6},
         {"not for this algorithm", {perimeterOnly}, Hsys::eSuccess, 12},
         {"an erased modifier is skipped", {gone, half}, Hsys::eSuccess, 6},
         {"none", {}, Hsys::eSuccess, 12},
     };
-    for (const auto& c : cases)
-        EXPECT_EQ(appliedTo(addRoom(c.chain), areaAlgorithm(), 12, c.status), c.value) << c.what;
+    for (const auto& [what, chain, status, value] : cases)
+        EXPECT_EQ(appliedTo(addRoom(chain), areaAlgorithm(), 12, status), value) << what;
 }
 
 TEST_F(ZyrModifierAttachment, equalModifiersComparesInOrderWithTheFirstEntry) {
@@ -182,12 +167,7 @@ TEST_F(ZyrModifierAttachment, equalModifiersComparesInOrderWithTheFirstEntry) {
     const HsDbObjectId none = addRoom();
     const HsDbObjectId busy = addRoom({half, balcony});
     HsDbObjectPointer<ZyrDbArea> heldOpen(busy, HsDb::kForWrite);
-    const struct {
-        const char* what;
-        std::vector<HsDbObjectId> entities;
-        bool equal;
-        std::size_t alerts;
-    } cases[] = {
+    const std::tuple<const char*, Ids, bool, std::size_t> cases[] = {
         {"one entity", {ba}, true, 0},
         {"same lists", {ab, alsoAb}, true, 0},
         {"other order", {ab, ba}, false, 0},
@@ -196,13 +176,13 @@ TEST_F(ZyrModifierAttachment, equalModifiersComparesInOrderWithTheFirstEntry) {
         {"first fails to open", {busy, ab, alsoAb}, false, 1},
         {"later fails to open", {ab, busy, alsoAb}, true, 1},
     };
-    for (const auto& c : cases) {
+    for (const auto& [what, ids, equal, alerts] : cases) {
         HsArray<HsDbObjectId> entities;
-        for (const HsDbObjectId& id : c.entities)
+        for (const HsDbObjectId& id : ids)
             entities.append(id);
         const ZyrUserMessageCapture capture;
-        EXPECT_EQ(Ops::equalModifiers(entities), c.equal) << c.what;
-        EXPECT_EQ(capture.entries().size(), c.alerts) << c.what;
+        EXPECT_EQ(Ops::equalModifiers(entities), equal) << what;
+        EXPECT_EQ(capture.entries().size(), alerts) << what;
     }
 }
 

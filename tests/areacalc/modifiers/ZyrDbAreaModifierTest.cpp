@@ -57,19 +57,15 @@ TEST_F(ZyrAreaModifiers, toleranceEqualValuesShareAnEntryAndItsResult) {
     const ScopedPointTolerance tolerance(0.01);
     ZyrDbAreaModifier modifier;
     ASSERT_EQ(modifier.setExpression(L"_AREA_VALUE_*1000"), Hsys::eSuccess);
-    const struct {
-        double value;
-        double result;
-        std::size_t entries;
-    } steps[] = {
+    const std::tuple<double, double, std::size_t> steps[] = {
         {10.0, 10000.0, 1},   {10.005, 10000.0, 1}, // the first value's result
         {9.99, 10000.0, 1},                         // exactly the tolerance away still counts
         {10.015, 10015.0, 2}, {10.008, 10015.0, 2}, // near both: the most recently used answers
         {10.0, 10000.0, 2},   {10.008, 10000.0, 2},
     };
-    for (const auto& step : steps) {
-        EXPECT_EQ(evaluated(modifier, step.value), step.result) << step.value;
-        EXPECT_EQ(cacheOf(modifier).size(), step.entries) << step.value;
+    for (const auto& [value, result, entries] : steps) {
+        EXPECT_EQ(evaluated(modifier, value), result) << value;
+        EXPECT_EQ(cacheOf(modifier).size(), entries) << value;
     }
 }
 
@@ -89,12 +85,7 @@ TEST_F(ZyrAreaModifiers, aFailedEvaluationCachesNothingAndIsTriedAgain) {
 // A refused change keeps both the record and its results.
 TEST_F(ZyrAreaModifiers, aChangedFormulaEmptiesTheCacheAtTheNextEvaluation) {
     using M = ZyrDbAreaModifier;
-    const struct {
-        Status (*change)(M&);
-        Status status;
-        double resultOfFive;
-        bool keepsResults;
-    } cases[] = {
+    const std::tuple<Status (*)(M&), Status, double, bool> cases[] = {
         {[](M& m) { return m.setExpression(L"_AREA_VALUE_*k+j"); }, Hsys::eSuccess, 10, true},
         {[](M& m) { return m.setExpression(L"_AREA_VALUE_*k+1"); }, Hsys::eSuccess, 11, false},
         {[](M& m) { return m.addParameter(L"h", 1); }, Hsys::eSuccess, 10, false},
@@ -112,7 +103,7 @@ TEST_F(ZyrAreaModifiers, aChangedFormulaEmptiesTheCacheAtTheNextEvaluation) {
     };
     for (std::size_t i = 0; i < std::size(cases); ++i) {
         SCOPED_TRACE(i);
-        const auto& c = cases[i];
+        const auto& [change, status, resultOfFive, keepsResults] = cases[i];
         ZyrDbAreaModifier modifier;
         ASSERT_EQ(modifier.algorithms().items(), (Classes{areaAlgorithm(), perimeterAlgorithm()}));
         ASSERT_EQ(modifier.setExpression(L"_AREA_VALUE_*k+j"), Hsys::eSuccess);
@@ -121,14 +112,14 @@ TEST_F(ZyrAreaModifiers, aChangedFormulaEmptiesTheCacheAtTheNextEvaluation) {
         evaluated(modifier, 5);
         evaluated(modifier, 6);
         const Parameters parameters = modifier.parameterPairVector();
-        EXPECT_EQ(c.change(modifier), c.status);
-        if (c.status != Hsys::eSuccess) {
+        EXPECT_EQ(change(modifier), status);
+        if (status != Hsys::eSuccess) {
             EXPECT_EQ(std::pair(modifier.parameterPairVector(), modifier.algorithms().count()),
                       std::pair(parameters, 2));
         }
         EXPECT_EQ(cacheOf(modifier).size(), 2u) << "stale results stay until the next evaluation";
-        EXPECT_EQ(evaluated(modifier, 5), c.resultOfFive);
-        EXPECT_EQ(cacheOf(modifier).size(), c.keepsResults ? 2u : 1u);
+        EXPECT_EQ(evaluated(modifier, 5), resultOfFive);
+        EXPECT_EQ(cacheOf(modifier).size(), keepsResults ? 2u : 1u);
     }
 }
 
@@ -233,39 +224,34 @@ TEST_F(ZyrAreaModifiers, theRecordIsFiledInItsOrderAndReadWholeOrNotAtAll) {
 
 // Names and values pair by position; a later formula wins and a foreign group ends the read.
 TEST_F(ZyrAreaModifiers, anOldGroupStreamPairsNamesWithValuesByPosition) {
-    const struct {
-        std::vector<HsDbTdfItem> items;
-        Status status;
-        const wchar_t* formula;
-        Parameters parameters;
-        Classes algorithms;
-        std::size_t position;
-    } cases[] = {
-        {{{1, L"_AREA_VALUE_*a"},
-          {2, L"a"},
-          {2, L"b"},
-          {40, 0.5},
-          {3, L"ZyrAreaCalculationAreaAlgorithm"}},
-         Hsys::eSuccess,
-         L"_AREA_VALUE_*a",
-         {{L"a", 0.5}},
-         {areaAlgorithm()},
-         5},
-        {{{1, L"a"}, {40, 1.0}, {40, 2.0}, {1, L"_AREA_VALUE_"}, {2, L"a"}, {70, 5}, {1, L"x"}},
-         Hsys::eSuccess,
-         L"_AREA_VALUE_",
-         {{L"a", 1.0}},
-         {},
-         5},
-        {{{1, L"f"}, {40, L"text"}}, Hsys::eWrongType, L"f", {}, {}, 2},
-    };
-    for (const auto& c : cases) {
-        HsDbTdfFiler filer(c.items, HsDb::kFileFiler, false);
+    const std::tuple<std::vector<HsDbTdfItem>, Status, const wchar_t*, Parameters, Classes,
+                     std::size_t>
+        cases[] = {
+            {{{1, L"_AREA_VALUE_*a"},
+              {2, L"a"},
+              {2, L"b"},
+              {40, 0.5},
+              {3, L"ZyrAreaCalculationAreaAlgorithm"}},
+             Hsys::eSuccess,
+             L"_AREA_VALUE_*a",
+             {{L"a", 0.5}},
+             {areaAlgorithm()},
+             5},
+            {{{1, L"a"}, {40, 1.0}, {40, 2.0}, {1, L"_AREA_VALUE_"}, {2, L"a"}, {70, 5}, {1, L"x"}},
+             Hsys::eSuccess,
+             L"_AREA_VALUE_",
+             {{L"a", 1.0}},
+             {},
+             5},
+            {{{1, L"f"}, {40, L"text"}}, Hsys::eWrongType, L"f", {}, {}, 2},
+        };
+    for (const auto& [items, status, formula, parameters, algorithms, position] : cases) {
+        HsDbTdfFiler filer(items, HsDb::kFileFiler, false);
         ZyrImpAreaModifier modifier;
-        EXPECT_EQ(modifier.tdfInFieldsQuillon(&filer), c.status) << c.formula;
+        EXPECT_EQ(modifier.tdfInFieldsQuillon(&filer), status) << formula;
         EXPECT_EQ(std::tuple(modifier.expression().str(), modifier.parameterPairVector(),
                              modifier.algorithms().items(), filer.position()),
-                  std::tuple(std::wstring(c.formula), c.parameters, c.algorithms, c.position));
+                  std::tuple(std::wstring(formula), parameters, algorithms, position));
     }
 }
 

@@ -5,10 +5,15 @@
 
 #include <algorithm>
 #include <cmath>
+#include <tuple>
 
 namespace {
 
 using Parameters = ZyrExpressionHandler::ParameterPairVector;
+// A formula, the area value and parameters bound into it, the status and result of evaluation,
+// and the text it expands to.
+using Case =
+    std::tuple<const wchar_t*, double, Parameters, Hsys::ErrorStatus, double, const wchar_t*>;
 
 ZyrParametricExpressionHandler handlerFor(const wchar_t* formula, double areaValue,
                                           const Parameters& parameters = {}) {
@@ -29,20 +34,8 @@ ZyrRmCString expand(const ZyrParametricExpressionHandler& handler,
 
 TEST(ZyrParametricExpressionHandler, evaluatesThePercentFTextAndExpandsTheCallbacksText) {
     const double failed = -777.0; // the evaluator leaves the result alone on failure
-    const struct {
-        const wchar_t* formula;
-        double areaValue;
-        Parameters parameters;
-        Hsys::ErrorStatus status;
-        double evaluated;
-        const wchar_t* expanded;
-    } cases[] = {
-        {L"_AREA_VALUE_*f+_AREA_VALUE_",
-         12.5,
-         {{L"f", 0.5}},
-         Hsys::eSuccess,
-         18.75,
-         L"12.5*0.5+12.5"},
+    const Case cases[] = {
+        {L"_AREA_VALUE_*f+_AREA_VALUE_", 2, {{L"f", 0.5}}, Hsys::eSuccess, 3, L"2*0.5+2"},
         {L"12*3", -1e9, {}, Hsys::eSuccess, 36, L"12*3"},
         // Evaluation sees six decimals, display the value itself. Kept: evaluation must give
         // the results modifiers have always given; a user is shown the value as it is.
@@ -59,19 +52,19 @@ TEST(ZyrParametricExpressionHandler, evaluatesThePercentFTextAndExpandsTheCallba
         // never binds and names inside it are no names of the formula.
         {L"_AREA_VALUE_*2", 3, {{L"_AREA_VALUE_", 99}}, Hsys::eSuccess, 6, L"3*2"},
         {L"_AREA_VALUE_+AREA", 1, {{L"AREA", 7}}, Hsys::eSuccess, 8, L"1+7"},
-        // Plain text replacement cuts the name out of a longer one too. Kept: the evaluator must
-        // never hear of the hard-coded name, wherever it stands.
+        // Plain text replacement cuts the name out of a longer one too. Kept: the evaluator
+        // must never hear of the hard-coded name, wherever it stands.
         {L"my_AREA_VALUE_*2", 3, {{L"my_AREA_VALUE_", 5}}, Hsys::eNameNotFound, failed, L"my3*2"},
         {L"_AREA_VALUE_/0", 12, {}, Hsys::eInvalidInput, failed, L"12/0"},
     };
-    for (const auto& c : cases) {
-        const auto handler = handlerFor(c.formula, c.areaValue, c.parameters);
+    for (const auto& [formula, areaValue, parameters, status, evaluated, expanded] : cases) {
+        const auto handler = handlerFor(formula, areaValue, parameters);
         double result = failed;
-        EXPECT_EQ(handler.evaluate(result), c.status) << handler.lastError().str();
-        EXPECT_NEAR(result, c.evaluated, 1e-12 * std::max(1.0, std::abs(c.evaluated))) << c.formula;
-        EXPECT_EQ(expand(handler, nullptr), c.expanded);
-        EXPECT_EQ(expand(handler, &ZyrExpressionHandler::defaultFormatCB), c.expanded);
-        EXPECT_EQ(handler.expression(), c.formula) << "the stored text is never changed";
+        EXPECT_EQ(handler.evaluate(result), status) << handler.lastError().str();
+        EXPECT_NEAR(result, evaluated, 1e-12 * std::max(1.0, std::abs(evaluated))) << formula;
+        EXPECT_EQ(expand(handler, nullptr), expanded);
+        EXPECT_EQ(expand(handler, &ZyrExpressionHandler::defaultFormatCB), expanded);
+        EXPECT_EQ(handler.expression(), formula) << "the stored text is never changed";
     }
 }
 

@@ -42,15 +42,8 @@ TEST(ZyrAreaCalculationBaseTexts, everyNumberHasOneTidyWordingThatResolvesWhileR
 
 TEST(ZyrAreaCalculationClassRegistration, classesStandAsTheClassTableSays) {
     ZyrAreaCalculationTestModule::registerClasses();
-    const struct {
-        HsRxClass* (*desc)();
-        const wchar_t* name;
-        const wchar_t* parent;
-        int flags;
-        bool creatable;
-        int nameText;
-        int secondText;
-    } table[] = {
+    using Desc = HsRxClass* (*)();
+    const std::tuple<Desc, const wchar_t*, const wchar_t*, int, bool, int, int> table[] = {
         {ZyrAreaCalculationAlgorithm::desc, L"ZyrAreaCalculationAlgorithm", L"HsRxObject", 0, false,
          -1, -1},
         {ZyrAreaCalculationAreaAlgorithm::desc, L"ZyrAreaCalculationAreaAlgorithm",
@@ -64,20 +57,20 @@ TEST(ZyrAreaCalculationClassRegistration, classesStandAsTheClassTableSays) {
         {ZyrDatabaseDataZyrAreaCalculationBase::desc, L"ZyrDatabaseDataZyrAreaCalculationBase",
          L"ZyrDatabaseData", 80, true, -1, -1},
     };
-    for (const auto& row : table) {
-        const HsRxClass* cls = row.desc();
-        ASSERT_NE(cls, nullptr) << row.name;
-        EXPECT_EQ(hsrxFindHsRxClass(row.name), cls);
-        EXPECT_STREQ(cls->myParent()->name(), row.parent) << row.name;
-        EXPECT_EQ(cls->proxyFlags(), row.flags) << row.name;
-        EXPECT_STREQ(cls->recordName(), L"") << row.name;
+    for (const auto& [desc, name, parent, flags, creatable, nameText, secondText] : table) {
+        const HsRxClass* cls = desc();
+        ASSERT_NE(cls, nullptr) << name;
+        EXPECT_EQ(hsrxFindHsRxClass(name), cls);
+        EXPECT_STREQ(cls->myParent()->name(), parent) << name;
+        EXPECT_EQ(cls->proxyFlags(), flags) << name;
+        EXPECT_STREQ(cls->recordName(), L"") << name;
         std::unique_ptr<HsRxObject> made(cls->create());
-        EXPECT_EQ(made != nullptr ? made->isA() : nullptr, row.creatable ? cls : nullptr);
+        EXPECT_EQ(made != nullptr ? made->isA() : nullptr, creatable ? cls : nullptr);
         const ZyrRxClassDecorator* decorator = ZyrDecoratorManager::find(cls);
-        ASSERT_NE(decorator, nullptr) << row.name;
+        ASSERT_NE(decorator, nullptr) << name;
         EXPECT_EQ(std::pair(decorator->displayNameId(), decorator->secondTextId()),
-                  std::pair(row.nameText, row.secondText))
-            << row.name;
+                  std::pair(nameText, secondText))
+            << name;
     }
     EXPECT_EQ(ZyrAreaCalculationPerimeterAlgorithm::rxInit(),
               ZyrAreaCalculationPerimeterAlgorithm::desc())

@@ -30,17 +30,15 @@ TEST_F(ThreeClasses, uniqueAddRefusesWhatIsHeldAndSortsOnlyWhenAListBringsSometh
     EXPECT_EQ(plain.add(c[1]), Hsys::eSuccess);
     EXPECT_EQ(plain.count(), 2);
 
-    const struct {
-        std::vector<HsRxClass*> added;
-        std::vector<HsRxClass*> expected;
-    } cases[] = {{{}, {c[2], c[0]}},
-                 {{c[0], c[2], c[0]}, {c[2], c[0]}},
-                 {{c[1]}, {c[0], c[1], c[2]}},
-                 {{c[1], c[1], nullptr}, {nullptr, c[0], c[1], c[2]}}};
-    for (const auto& k : cases) {
+    const std::tuple<std::vector<HsRxClass*>, std::vector<HsRxClass*>> cases[] = {
+        {{}, {c[2], c[0]}},
+        {{c[0], c[2], c[0]}, {c[2], c[0]}},
+        {{c[1]}, {c[0], c[1], c[2]}},
+        {{c[1], c[1], nullptr}, {nullptr, c[0], c[1], c[2]}}};
+    for (const auto& [added, expected] : cases) {
         Classes classes = held;
-        EXPECT_EQ(classes.add(k.added), Hsys::eSuccess);
-        EXPECT_EQ(classes.items(), k.expected) << k.added.size();
+        EXPECT_EQ(classes.add(added), Hsys::eSuccess);
+        EXPECT_EQ(classes.items(), expected) << added.size();
     }
 }
 

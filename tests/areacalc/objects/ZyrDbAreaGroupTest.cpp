@@ -57,21 +57,18 @@ TEST_F(ZyrAreaGroups, aDrawingFileGivesBackTheTreeWithItsMembersInOrder) {
     const HsDbObjectId L = addGroup(L"L", {}, {d}), root = addGroup(L"root", {K, L}, {a});
     HsDbObjectPointer<ZyrDbAreaGroup>(L, HsDb::kForWrite)->groupHandler()->setNodeOwnership(2);
     const std::unique_ptr<HsDbDatabase> loaded = reloaded();
-    const struct {
-        HsDbObjectId group;
-        Ids nodes, leafs, leafsBelow;
-        unsigned short mode;
-    } groups[] = {{root, {K, L}, {a}, {a, b, c, a, d}, 3}, {L, {}, {d}, {d}, 2}};
-    for (const auto& g : groups) {
-        HsDbObjectPointer<ZyrDbAreaGroup> group(there(*loaded, {g.group})[0], HsDb::kForRead);
+    const std::tuple<HsDbObjectId, Ids, Ids, Ids, unsigned short> groups[] = {
+        {root, {K, L}, {a}, {a, b, c, a, d}, 3}, {L, {}, {d}, {d}, 2}};
+    for (const auto& [id, nodes, leafs, allLeafs, mode] : groups) {
+        HsDbObjectPointer<ZyrDbAreaGroup> group(there(*loaded, {id})[0], HsDb::kForRead);
         ASSERT_TRUE(group);
         const ZyrDbAreaGroup& loadedGroup = *group.object();
         const ZyrGroupHandler& handler = *loadedGroup.groupHandler();
         Ids leafsBelow;
         EXPECT_EQ(handler.leafs(leafsBelow), Hsys::eSuccess);
         EXPECT_EQ(std::tuple(handler.nodes(), handler.leafs(), leafsBelow, handler.nodeOwnership()),
-                  std::tuple(there(*loaded, g.nodes), there(*loaded, g.leafs),
-                             there(*loaded, g.leafsBelow), g.mode));
+                  std::tuple(there(*loaded, nodes), there(*loaded, leafs), there(*loaded, allLeafs),
+                             mode));
         EXPECT_EQ(loadedGroup.algorithms().items(), available) << "the classes by their names";
         EXPECT_EQ(loadedGroup.styleId(),
                   there(*loaded, {ZyrDictAreaGroupStyle::getStandardAreaGroupStyle(&database)})[0])

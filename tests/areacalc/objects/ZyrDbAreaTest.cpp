@@ -106,36 +106,29 @@ TEST_F(ZyrDbAreas, scalesAndExtentsTakeWidthAndHeightWithoutSign) {
     const auto block = [](double x, double y, double z) {
         return HsGeBoundBlock3d({0, 0, 0}, {x, 0, 0}, {0, y, 0}, {0, 0, z});
     };
-    const struct {
-        ZyrScaleInfo scale;
-        HsGeBoundBlock3d extent;
-        int options;
-        Hsys::ErrorStatus expected;
-        double width;
-        double height;
-    } cases[] = {
-        {{-2, 3, 1}, {}, 0, Hsys::eSuccess, 20, 24},
-        {{0.5, -0.25, -7}, {}, 0, Hsys::eSuccess, 5, 2},
-        {{0, 1, 1}, {}, 0, Hsys::eBadArgument, 10, 8},
-        {{}, block(-4, 2, 1), Options::sAcceptAll, Hsys::eSuccess, 4, 2},
-        {{}, block(4, 2, 1), Options::sIgnoreX, Hsys::eSuccess, 10, 2},
-        {{}, block(4, 2, 1), Options::sIgnoreY, Hsys::eSuccess, 4, 8},
-        {{}, block(4, 2, 1), Options::sIgnoreZ, Hsys::eBadArgument, 10, 8},
-        {{}, block(4, 2, -1), Options::sAcceptAll, Hsys::eBadArgument, 10, 8},
-        {{}, block(0, 2, 1), Options::sAcceptAll, Hsys::eBadArgument, 10, 8},
-        {{}, block(4, 1e-12, 1), Options::sAcceptAll, Hsys::eBadArgument, 10, 8},
-    };
+    const std::tuple<ZyrScaleInfo, HsGeBoundBlock3d, int, Hsys::ErrorStatus, double, double>
+        cases[] = {
+            {{-2, 3, 1}, {}, 0, Hsys::eSuccess, 20, 24},
+            {{0.5, -0.25, -7}, {}, 0, Hsys::eSuccess, 5, 2},
+            {{0, 1, 1}, {}, 0, Hsys::eBadArgument, 10, 8},
+            {{}, block(-4, 2, 1), Options::sAcceptAll, Hsys::eSuccess, 4, 2},
+            {{}, block(4, 2, 1), Options::sIgnoreX, Hsys::eSuccess, 10, 2},
+            {{}, block(4, 2, 1), Options::sIgnoreY, Hsys::eSuccess, 4, 8},
+            {{}, block(4, 2, 1), Options::sIgnoreZ, Hsys::eBadArgument, 10, 8},
+            {{}, block(4, 2, -1), Options::sAcceptAll, Hsys::eBadArgument, 10, 8},
+            {{}, block(0, 2, 1), Options::sAcceptAll, Hsys::eBadArgument, 10, 8},
+            {{}, block(4, 1e-12, 1), Options::sAcceptAll, Hsys::eBadArgument, 10, 8},
+        };
     for (std::size_t i = 0; i < std::size(cases); ++i) {
-        const auto& c = cases[i];
+        const auto& [scale, extent, options, expected, expectedWidth, expectedHeight] = cases[i];
         ZyrImpArea area;
         ASSERT_EQ(area.setProfile(rectangle(10, 8)), Hsys::eSuccess);
-        const bool byExtent = c.extent.direction3().z != 0.0; // the scale rows give no block
-        EXPECT_EQ(byExtent ? area.setLocalExtents(c.extent, c.options) : area.scaleBy(c.scale),
-                  c.expected)
+        const bool byExtent = extent.direction3().z != 0.0; // the scale rows give no block
+        EXPECT_EQ(byExtent ? area.setLocalExtents(extent, options) : area.scaleBy(scale), expected)
             << i;
         const auto [width, height] = localSize(area);
-        EXPECT_NEAR(width, c.width, 1e-9) << i;
-        EXPECT_NEAR(height, c.height, 1e-9) << i;
+        EXPECT_NEAR(width, expectedWidth, 1e-9) << i;
+        EXPECT_NEAR(height, expectedHeight, 1e-9) << i;
         EXPECT_GT(area.area(), 0.0) << i << ": a mirror must not make a hole of the outline";
     }
 }
@@ -188,16 +181,13 @@ TEST_F(ZyrDbAreas, theSummaryShowsNameStyleAreaAndPerimeter) {
     ASSERT_EQ(sides->addSegment(new ZyrGeSegment2d({0, 0}, {3, 0})), Hsys::eSuccess);
     ASSERT_EQ(sides->addSegment(new ZyrGeSegment2d({3, 0}, {3, 4})), Hsys::eSuccess);
     ASSERT_EQ(open->addRing(sides), Hsys::eSuccess);
-    const struct {
-        ZyrGeProfile* profile;
-        const wchar_t* area;
-        const wchar_t* perimeter;
-    } cases[] = {{rectangleWithHole(), L"76.00 m\u00b2", L"44.00 m"},
-                 {nullptr, L"0.00 m\u00b2", L"0.00 m"},
-                 {open, L"Invalid outline", L"7.00 m"}};
+    const std::tuple<ZyrGeProfile*, const wchar_t*, const wchar_t*> cases[] = {
+        {rectangleWithHole(), L"76.00 m\u00b2", L"44.00 m"},
+        {nullptr, L"0.00 m\u00b2", L"0.00 m"},
+        {open, L"Invalid outline", L"7.00 m"}};
     const HsDbObjectId office = addAreaStyle(L"Office");
-    for (const auto& c : cases) {
-        HsDbObjectPointer<ZyrDbArea> area(addArea(L"Kitchen", c.profile, office), HsDb::kForRead);
+    for (const auto& [profile, areaText, perimeterText] : cases) {
+        HsDbObjectPointer<ZyrDbArea> area(addArea(L"Kitchen", profile, office), HsDb::kForRead);
         ZyrDesc desc(&database);
         area->areaImp()->summaryInfo(&desc);
         std::vector<std::wstring> lines;
@@ -206,10 +196,10 @@ TEST_F(ZyrDbAreas, theSummaryShowsNameStyleAreaAndPerimeter) {
         // Without modifiers the net rows repeat the gross ones.
         EXPECT_EQ(lines,
                   (std::vector<std::wstring>{L"Name: Kitchen", L"Area Style: Office",
-                                             std::wstring(L"Area: ") + c.area,
-                                             std::wstring(L"Perimeter: ") + c.perimeter,
-                                             std::wstring(L"Net area: ") + c.area,
-                                             std::wstring(L"Net perimeter: ") + c.perimeter}));
+                                             std::wstring(L"Area: ") + areaText,
+                                             std::wstring(L"Perimeter: ") + perimeterText,
+                                             std::wstring(L"Net area: ") + areaText,
+                                             std::wstring(L"Net perimeter: ") + perimeterText}));
     }
 }
 

@@ -1,9 +1,12 @@
 // What every public/implementation pair of the module offers: registration, the gates of open,
-// the text filing refusals and the nest of version words in binary streams.
+// the text filing refusals and the nest of version words in binary streams; the dictionaries of
+// the records, a style's sample, and property sets of areas that lie on their styles.
 #include "tests/areacalc/ZyrAreaDrawing.h"
 
 #include "areacalc/calc/ZyrAreaDbOperations.h"
 #include "areacalc/objects/ZyrCompSpecTemplate.h"
+#include "areacalc/objects/ZyrDictAreaGroupDef.h"
+#include "areacalc/objects/ZyrDictAreaProposalNames.h"
 #include "platform/base/obj/ZyrImpGeo.h"
 #include "platform/host/db/HsDbProxyObject.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
@@ -14,13 +17,7 @@ namespace {
 using ZyrDbPairs = ZyrAreaDrawing;
 
 TEST_F(ZyrDbPairs, classesRegisterAsTheClassTableHasThem) {
-    const struct {
-        HsRxClass* cls;
-        HsRxClass* parent;
-        const wchar_t* recordName;
-        int flags;
-        const wchar_t* displayName;
-    } rows[] = {
+    const std::tuple<HsRxClass*, HsRxClass*, const wchar_t*, int, const wchar_t*> rows[] = {
         {ZyrDbArea::desc(), ZyrDbGeo::desc(), L"ZYR_AREA", 893, L"Area"},
         {ZyrImpArea::desc(), ZyrImpGeo::desc(), L"", 80, L""},
         {ZyrDbAreaGroup::desc(), ZyrDbGeo::desc(), L"ZYR_AREAGROUP", 893, L"Area Group"},
@@ -30,17 +27,17 @@ TEST_F(ZyrDbPairs, classesRegisterAsTheClassTableHasThem) {
         {ZyrDictAreaStyle::desc(), nullptr, L"", 0, L"Area Styles"},
         {ZyrCompSpecArea::desc(), nullptr, L"", 80, L""},
     };
-    for (const auto& row : rows) {
-        ASSERT_NE(row.cls, nullptr);
-        EXPECT_STREQ(row.cls->recordName(), row.recordName);
-        EXPECT_EQ(row.cls->proxyFlags(), row.flags) << row.cls->name();
-        EXPECT_EQ(row.cls->drawingVersion(), *row.recordName != L'\0' ? 23 : 0);
-        if (row.parent != nullptr) {
-            EXPECT_EQ(row.cls->myParent(), row.parent) << row.cls->name();
+    for (const auto& [cls, parent, recordName, flags, displayName] : rows) {
+        ASSERT_NE(cls, nullptr);
+        EXPECT_STREQ(cls->recordName(), recordName);
+        EXPECT_EQ(cls->proxyFlags(), flags) << cls->name();
+        EXPECT_EQ(cls->drawingVersion(), *recordName != L'\0' ? 23 : 0);
+        if (parent != nullptr) {
+            EXPECT_EQ(cls->myParent(), parent) << cls->name();
         }
         ZyrRmCString shown;
-        ZyrDecoratorManager::displayName(row.cls, shown);
-        EXPECT_EQ(shown, row.displayName);
+        ZyrDecoratorManager::displayName(cls, shown);
+        EXPECT_EQ(shown, displayName);
     }
     EXPECT_EQ(ZyrDbArea::rxInit(), ZyrDbArea::desc()) << "registering again gives the same class";
     EXPECT_EQ(ZyrDictAreaStyle(&database).objectClass(), ZyrDbArea::desc());
@@ -55,23 +52,20 @@ TEST_F(ZyrDbPairs, openPassesItsGatesInOrder) {
     const HsDbObjectId proxy = add(new HsDbProxyObject(L"ZyrDbArea"));
     // Held open for write: a gate that opened the style would meet this open instead.
     HsDbObjectPointer<ZyrDbAreaStyle> heldStyle(standardStyle, HsDb::kForWrite);
-    const struct {
-        HsDbObjectId id;
-        Hsys::ErrorStatus open;
-        Hsys::ErrorStatus openTrans;
-    } cases[] = {{HsDbObjectId::kNull, Hsys::eNullId, Hsys::eNullId},
-                 {standardStyle, Hsys::eWrongClass, Hsys::eWrongClass},
-                 {proxy, Hsys::eWrongClass, Hsys::eNoTransaction},
-                 {area, Hsys::eSuccess, Hsys::eNoTransaction}};
+    const std::tuple<HsDbObjectId, Hsys::ErrorStatus, Hsys::ErrorStatus> cases[] = {
+        {HsDbObjectId::kNull, Hsys::eNullId, Hsys::eNullId},
+        {standardStyle, Hsys::eWrongClass, Hsys::eWrongClass},
+        {proxy, Hsys::eWrongClass, Hsys::eNoTransaction},
+        {area, Hsys::eSuccess, Hsys::eNoTransaction}};
     ZyrDbArea stale;
-    for (const auto& c : cases) {
+    for (const auto& [id, opened, openTrans] : cases) {
         ZyrDbArea* out = &stale;
-        EXPECT_EQ(ZyrDbArea::open(out, c.id, HsDb::kForRead), c.open) << c.id;
-        EXPECT_EQ(out != nullptr, c.open == Hsys::eSuccess) << c.id;
+        EXPECT_EQ(ZyrDbArea::open(out, id, HsDb::kForRead), opened) << id;
+        EXPECT_EQ(out != nullptr, opened == Hsys::eSuccess) << id;
         if (out != nullptr)
             out->close();
         out = &stale;
-        EXPECT_EQ(ZyrDbArea::openTrans(out, c.id, HsDb::kForRead), c.openTrans) << c.id;
+        EXPECT_EQ(ZyrDbArea::openTrans(out, id, HsDb::kForRead), openTrans) << id;
         EXPECT_EQ(out, nullptr);
     }
     HsDbObjectPointer<HsDbObject> reopened(proxy, HsDb::kForWrite);
@@ -195,6 +189,55 @@ TEST_F(ZyrDbPairs, everyTruncatedAreaStreamFailsWithoutAHalfReadArea) {
     HsDbBdfFiler reader(geometry.bytes(), &database);
     ZyrDbArea area;
     EXPECT_EQ(area.bdfInFields(&reader), Hsys::eWrongClass) << "an implementation of no area";
+}
+
+TEST_F(ZyrDbPairs, dictionariesKeepTheirPersistentNamesAndStandardRecords) {
+    EXPECT_EQ(ZyrDictAreaStyle(&database).dictionaryName(), L"ZYR_AREA_STYLES");
+    EXPECT_EQ(ZyrDictAreaGroupStyle(&database).dictionaryName(), L"ZYR_AREAGROUP_STYLES");
+    EXPECT_EQ(ZyrDictAreaGroupDef(&database).dictionaryName(), L"ZYR_AREA_GROUP_DEFS");
+    EXPECT_EQ(ZyrDictAreaProposalNames(&database).dictionaryName(), L"ZYR_AREA_PROPOSALNAMES");
+    EXPECT_EQ(ZyrDictAreaModifiers(&database).dictionaryName(), L"ZYR_AREA_MODIFIERS");
+    EXPECT_FALSE(ZyrDictAreaModifiers(&database).hasStandard());
+    EXPECT_EQ(ZyrDictAreaGroupStyle::getStandardAreaGroupStyle(&database).objectClass(),
+              ZyrDbAreaGroupStyle::desc());
+    EXPECT_TRUE(ZyrDictAreaGroupDef::getStandardAreaGroupDef(&database).isNull());
+
+    HsDbDatabase bare;
+    EXPECT_TRUE(ZyrDictAreaStyle::getStandardAreaStyle(&bare).isNull());
+    EXPECT_FALSE(ZyrDictAreaStyle(&bare).hsdbDictionaryExists()) << "the getter makes nothing";
+}
+
+TEST_F(ZyrDbPairs, aSampleShowsTheStyleItWasAskedOf) {
+    const HsDbObjectId office = addAreaStyle(L"Office");
+    std::unique_ptr<ZyrDbArea> sample(
+        HsDbObjectPointer<ZyrDbAreaStyle>(office, HsDb::kForRead)->getSample());
+    ASSERT_NE(sample, nullptr);
+    EXPECT_EQ(sample->styleId(), office);
+    ZyrImpAreaGroupStyle groupStyle;
+    EXPECT_EQ(ZyrImpAreaStyle().copyFrom(&groupStyle), Hsys::eBadArgument);
+}
+
+TEST_F(ZyrDbPairs, propertySetsOfAnAreaLieOnTheAreaAndItsStyle) {
+    ZyrCompSpecArea compSpec;
+    EXPECT_EQ(compSpec.worksWith(), ZyrDbArea::desc());
+    HsArray<void*> extended;
+    compSpec.extendedClasses(extended);
+    ASSERT_EQ(extended.length(), 1);
+    EXPECT_EQ(extended.at(0), ZyrDbAreaStyle::desc());
+
+    const HsDbObjectId office = addAreaStyle(L"Office");
+    const HsDbObjectId kitchen = addArea(L"Kitchen", rectangle(4, 3), office);
+    const std::tuple<HsDbObjectId, std::vector<HsDbObjectId>> cases[] = {
+        {kitchen, {kitchen, office}}, {office, {office}}};
+    for (const auto& [entity, locations] : cases) {
+        HsDbObjectPointer<HsDbObject> object(entity, HsDb::kForRead);
+        HsArray<HsDbObjectId> ids;
+        ZyrRmCStringArray names;
+        EXPECT_EQ(compSpec.propSetLocations(object.object(), ids, names), Hsys::eSuccess);
+        ASSERT_EQ(ids.length(), static_cast<int>(locations.size()));
+        EXPECT_EQ(ids.at(ids.length() - 1), locations.back());
+        EXPECT_EQ(names.back(), L"Office");
+    }
 }
 
 } // namespace

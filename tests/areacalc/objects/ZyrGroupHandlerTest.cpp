@@ -1,134 +1,60 @@
-// The group handler on a tree of sample groups and leafs: the rules of adding and removing, the
+// The group handler on a tree of area groups and areas: the rules of adding and removing, the
 // answers over the whole tree, erased members, the way back through the relationship graph before
 // and after a drawing file, the handler's copy and filing, and the labels of ownership modes.
-#include "areacalc/module/ZyrAreaCalculationBaseApp.h"
+#include "tests/areacalc/ZyrAreaDrawing.h"
+
 #include "areacalc/objects/ZyrGroupHandlerFunctional.h"
-#include "areacalc/objects/ZyrStandardGroupHandlerImp.h"
+#include "areacalc/objects/ZyrGroupNodeTypes.h"
 #include "areacalc/objects/ZyrWriteToRead.h"
-#include "platform/base/app/ZyrAppHdx.h"
 #include "platform/base/app/ZyrBaseServices.h"
-#include "platform/base/app/ZyrRxClassDecorator.h"
-#include "platform/base/obj/ZyrDbGeo.h"
-#include "platform/base/obj/ZyrImpGeo.h"
 #include "platform/base/relgraph/ZyrObjReferenceInfo.h"
 #include "platform/base/relgraph/ZyrObjReferenceMap.h"
-#include "platform/host/db/HsDbDatabase.h"
-#include "platform/host/db/HsDbObjectPointer.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
-#include "platform/host/rx/HsRxClass.h"
 #include "platform/host/ut/HsAssertionViolation.h"
 
-#include <gtest/gtest.h>
-
-#include <filesystem>
 #include <tuple>
-#include <unistd.h>
 
-class ZyrDbTestGroup;
-
-class ZyrDbTestLeaf : public ZyrDbGeo {
-    HSRX_DECLARE_MEMBERS(ZyrDbTestLeaf)
+// A group of a class derived from the group class, without display texts. It is registered with
+// the module's classes, after its parent: registered at load time it would find no parent yet.
+class ZyrDbTestSubGroup : public ZyrDbAreaGroup {
+    ZYR_AREACALC_DECLARE_MEMBERS(ZyrDbTestSubGroup)
 };
-HSRX_DEFINE_MEMBERS(ZyrDbTestLeaf, ZyrDbGeo, 0, hsrxInstantiateClass<ZyrDbTestLeaf>)
-
-// Holds its handler as the module's group does, and files it after its version word.
-class ZyrImpTestGroup : public ZyrImpGeo {
-    HSRX_DECLARE_MEMBERS(ZyrImpTestGroup)
-
-public:
-    using Handler = ZyrStandardGroupHandlerImp<ZyrImpTestGroup, ZyrDbTestGroup, ZyrDbTestLeaf>;
-
-    const ZyrGroupHandler* groupHandler() const { return &m_handler; }
-    ZyrGroupHandler* groupHandler() { return &m_handler; }
-    Hsys::ErrorStatus bdfInFields(HsDbBdfFiler* filer) override {
-        if (const Hsys::ErrorStatus status = ZyrImpGeo::bdfInFields(filer);
-            status != Hsys::eSuccess)
-            return status;
-        return bdfInVersion(filer) == Hsys::eSuccess ? m_handlerImp.bdfInFields(filer)
-                                                     : filer->filerStatus();
-    }
-    Hsys::ErrorStatus bdfOutFields(HsDbBdfFiler* filer) const override {
-        ZyrImpGeo::bdfOutFields(filer);
-        bdfOutVersion(filer);
-        return m_handlerImp.bdfOutFields(filer);
-    }
-    Hsys::ErrorStatus getReferencedObjects(ZyrObjReferenceMap& map) const override {
-        ZyrImpGeo::getReferencedObjects(map);
-        return m_handlerImp.getReferencedObjects(map);
-    }
-
-private:
-    Handler m_handlerImp{this};
-    ZyrGroupHandler m_handler{m_handlerImp};
-};
-HSRX_DEFINE_MEMBERS(ZyrImpTestGroup, ZyrImpGeo, 0, hsrxInstantiateClass<ZyrImpTestGroup>)
-
-class ZyrDbTestGroup : public ZyrDbGeo {
-    HSRX_DECLARE_MEMBERS(ZyrDbTestGroup)
-
-public:
-    ZyrDbTestGroup() : ZyrDbGeo(false) { setImp(new ZyrImpTestGroup); }
-    const ZyrGroupHandler* groupHandler() const {
-        return std::as_const(*ZyrImpTestGroup::cast(imp())).groupHandler();
-    }
-    ZyrGroupHandler* groupHandler() {
-        assertWriteEnabled();
-        return ZyrImpTestGroup::cast(imp())->groupHandler();
-    }
-};
-HSRX_DEFINE_MEMBERS(ZyrDbTestGroup, ZyrDbGeo, 0, hsrxInstantiateClass<ZyrDbTestGroup>)
-
-class ZyrDbTestSubGroup : public ZyrDbTestGroup {
-    HSRX_DECLARE_MEMBERS(ZyrDbTestSubGroup)
-};
-HSRX_DEFINE_MEMBERS(ZyrDbTestSubGroup, ZyrDbTestGroup, 0, hsrxInstantiateClass<ZyrDbTestSubGroup>)
+ZYR_AREACALC_DEFINE_MEMBERS(ZyrDbTestSubGroup, ZyrDbAreaGroup, 0,
+                            hsrxInstantiateClass<ZyrDbTestSubGroup>, ZyrRxClassDecorator::kNoText,
+                            ZyrRxClassDecorator::kNoText)
 
 namespace {
 
-using Ids = std::vector<HsDbObjectId>;
-
-int gImage;
-HsModuleHandle gTestModule = &gImage;
-AFX_EXTENSION_MODULE gExtension;
-constexpr int kGroupName = 28972;
-constexpr int kLeafName = 29001;
-const ZyrRxClassDecorator gGroupDecorator(typeid(ZyrDbTestGroup), typeid(ZyrDbGeo),
-                                          &ZyrDbTestGroup::desc, &ZyrDbTestGroup::desc,
-                                          &gTestModule, kGroupName, ZyrRxClassDecorator::kNoText);
-const ZyrRxClassDecorator gLeafDecorator(typeid(ZyrDbTestLeaf), typeid(ZyrDbGeo),
-                                         &ZyrDbTestLeaf::desc, &ZyrDbTestLeaf::desc, &gTestModule,
-                                         kLeafName, ZyrRxClassDecorator::kNoText);
-
 // R holds A, B and l1; A holds C and l2; B may hold leafs only and holds l4; C holds l3 and l1
-// again. S, of a class derived from the group class, holds l5.
+// again. S, of the derived class, holds l5.
 struct Tree {
     HsDbObjectId R, A, B, C, S, l1, l2, l3, l4, l5;
 };
 
-class ZyrGroupHandlerTree : public ::testing::Test {
+// The drawing with the relationship graph (the way back from members) running.
+class ZyrGroupHandlerTree : public ZyrAreaDrawing {
 protected:
-    void SetUp() override { ASSERT_EQ(ZyrBaseServices::registerService(&app), Hsys::eSuccess); }
+    void SetUp() override {
+        ZyrAreaDrawing::SetUp();
+        ASSERT_EQ(ZyrBaseServices::registerService(&ZyrAreaCalculationTestModule::client()),
+                  Hsys::eSuccess);
+    }
     void TearDown() override {
-        EXPECT_EQ(ZyrBaseServices::unRegisterService(&app), Hsys::eSuccess);
+        EXPECT_EQ(ZyrBaseServices::unRegisterService(&ZyrAreaCalculationTestModule::client()),
+                  Hsys::eSuccess);
     }
 
-    HsDbObjectId add(HsDbObject* object) {
-        HsDbObjectId id;
-        EXPECT_EQ(database.addHsDbObject(id, object), Hsys::eSuccess);
-        object->close();
-        return id;
-    }
-    HsDbObjectId leaf() { return add(new ZyrDbTestLeaf); }
-    HsDbObjectId group(unsigned short mode = 3, ZyrDbTestGroup* made = new ZyrDbTestGroup) {
+    HsDbObjectId leaf() { return add(new ZyrDbArea); }
+    HsDbObjectId group(unsigned short mode = 3, ZyrDbAreaGroup* made = new ZyrDbAreaGroup) {
         EXPECT_EQ(made->groupHandler()->setNodeOwnership(mode), Hsys::eSuccess);
         return add(made);
     }
     template <class Change> static auto change(const HsDbObjectId& id, Change change) {
-        HsDbObjectPointer<ZyrDbTestGroup> group(id, HsDb::kForWrite);
+        HsDbObjectPointer<ZyrDbAreaGroup> group(id, HsDb::kForWrite);
         return change(*group->groupHandler());
     }
     template <class Question> static auto ask(const HsDbObjectId& id, Question question) {
-        HsDbObjectPointer<ZyrDbTestGroup> group(id, HsDb::kForRead);
+        HsDbObjectPointer<ZyrDbAreaGroup> group(id, HsDb::kForRead);
         return question(*std::as_const(*group.object()).groupHandler());
     }
     static Hsys::ErrorStatus addNode(const HsDbObjectId& to, const HsDbObjectId& id) {
@@ -144,13 +70,10 @@ protected:
                   Hsys::eSuccess);
         return out;
     }
-    template <class Group = ZyrDbTestGroup> static Ids owners(const HsDbObjectId& id) {
+    template <class Group = ZyrDbAreaGroup> static Ids owners(const HsDbObjectId& id) {
         Ids out;
         EXPECT_EQ(ZyrGroupHandlerFunctional::ownerGroups<Group>(id, out), Hsys::eSuccess);
         return out;
-    }
-    static void erase(const HsDbObjectId& id) {
-        EXPECT_EQ(HsDbObjectPointer<HsDbObject>(id, HsDb::kForWrite)->erase(), Hsys::eSuccess);
     }
     void fill(const HsDbObjectId& group, const Ids& nodes, const Ids& leafs) {
         for (const HsDbObjectId& node : nodes)
@@ -168,9 +91,6 @@ protected:
         fill(t.S, {}, {t.l5});
         return t;
     }
-
-    ZyrAppHdx app{L"GroupHandlerTest80", nullptr, gExtension, L"GroupHandlerTest"};
-    HsDbDatabase database;
 };
 
 TEST_F(ZyrGroupHandlerTree, answersOverTheWholeTreeDepthFirst) {
@@ -247,7 +167,7 @@ TEST_F(ZyrGroupHandlerTree, addsAndRemovesInBulkAndTheGraphFollows) {
     EXPECT_EQ(owners(t.C), Ids{});
     EXPECT_EQ(addNode(t.C, t.R), Hsys::eSuccess) << "no cycle once the link is gone";
 
-    HsDbObjectPointer<ZyrDbTestGroup> readOnly(t.A, HsDb::kForWrite);
+    HsDbObjectPointer<ZyrDbAreaGroup> readOnly(t.A, HsDb::kForWrite);
     ZyrGroupHandler& handler = *readOnly->groupHandler();
     ASSERT_EQ(readOnly->downgradeOpen(), Hsys::eSuccess);
     EXPECT_EQ(handler.addNode(t.B), Hsys::eDoesNotApply) << "the write assertion is stopped";
@@ -276,34 +196,20 @@ TEST_F(ZyrGroupHandlerTree, findsOwnersAndObjectsThroughTheGraphBeforeAndAfterAD
     EXPECT_EQ(owners<ZyrDbTestSubGroup>(t.l1), Ids{});
     EXPECT_EQ(owners(leaf()), Ids{});
     Ids objects{t.l1};
-    EXPECT_EQ(ZyrGroupHandlerOperations::queryObjects(objects, ZyrImpTestGroup::desc(), &database),
-              Hsys::eNothingFound);
+    const auto query = [&](HsRxClass* cls, HsDbDatabase* in) {
+        return ZyrGroupHandlerOperations::queryObjects(objects, cls, in);
+    };
+    EXPECT_EQ(query(ZyrImpAreaGroup::desc(), &database), Hsys::eNothingFound);
     EXPECT_EQ(objects, Ids{t.l1});
     erase(t.S);
-    EXPECT_EQ(ZyrGroupHandlerOperations::queryObjects(objects, ZyrDbTestSubGroup::desc(), nullptr),
-              Hsys::eNullPointer)
-        << "no working database";
-    EXPECT_EQ(
-        ZyrGroupHandlerOperations::queryObjects(objects, ZyrDbTestSubGroup::desc(), &database),
-        Hsys::eNullId);
-    EXPECT_EQ(ZyrGroupHandlerOperations::queryObjects(objects, ZyrDbTestGroup::desc(), &database),
-              Hsys::eSuccess);
+    EXPECT_EQ(query(ZyrDbTestSubGroup::desc(), nullptr), Hsys::eNullPointer)
+        << "no working drawing";
+    EXPECT_EQ(query(ZyrDbTestSubGroup::desc(), &database), Hsys::eNullId);
+    EXPECT_EQ(query(ZyrDbAreaGroup::desc(), &database), Hsys::eSuccess);
     EXPECT_EQ(objects, (Ids{t.R, t.A, t.B, t.C}));
 
-    const std::wstring path = (std::filesystem::temp_directory_path() /
-                               ("ZyrGroupHandlerTest-" + std::to_string(getpid()) + ".drawing"))
-                                  .wstring();
-    ASSERT_EQ(database.saveAs(path.c_str()), Hsys::eSuccess);
-    HsDbDatabase loaded(HsDb::kEmptyDatabase);
-    ASSERT_EQ(loaded.readDrawingFile(path.c_str()), Hsys::eSuccess);
-    std::filesystem::remove(path);
-    const auto there = [&](const Ids& ids) {
-        Ids mapped;
-        for (const HsDbObjectId& id : ids)
-            EXPECT_EQ(loaded.getHsDbObjectId(mapped.emplace_back(), false, id.handle()),
-                      Hsys::eSuccess);
-        return mapped;
-    };
+    const std::unique_ptr<HsDbDatabase> loaded = reloaded();
+    const auto there = [&](const Ids& ids) { return ZyrAreaDrawing::there(*loaded, ids); };
     EXPECT_EQ(below(there({t.R})[0], &ZyrGroupHandler::childs),
               there({t.A, t.B, t.C, t.l1, t.l2, t.l3, t.l1, t.l4}));
     EXPECT_EQ(owners(there({t.l1})[0]), there({t.R, t.C}));
@@ -335,11 +241,10 @@ TEST_F(ZyrGroupHandlerTree, copiesAndFilesItsListsAndModeAndRefusesEveryTruncati
     // The mode, a little-endian uint16, becomes 7: it is stored as read, with no range check.
     bytes[bytes.size() - 2] = 7;
 
-    ZyrImpTestGroup::Handler read(nullptr);
+    ZyrImpAreaGroup::Handler read(nullptr);
     using OtherLeafs =
-        ZyrStandardGroupHandlerImp<ZyrImpTestGroup, ZyrDbTestGroup, ZyrDbTestSubGroup>;
-    using OtherNodes =
-        ZyrStandardGroupHandlerImp<ZyrImpTestGroup, ZyrDbTestSubGroup, ZyrDbTestLeaf>;
+        ZyrStandardGroupHandlerImp<ZyrImpAreaGroup, ZyrDbAreaGroup, ZyrDbTestSubGroup>;
+    using OtherNodes = ZyrStandardGroupHandlerImp<ZyrImpAreaGroup, ZyrDbTestSubGroup, ZyrDbArea>;
     EXPECT_EQ(read.copyFrom(OtherLeafs(nullptr)), Hsys::eDoesNotApply);
     EXPECT_EQ(read.copyFrom(OtherNodes(nullptr)), Hsys::eDoesNotApply);
     ask(t.B, [&](const ZyrGroupHandler& h) { return read.copyFrom(h.imp()); });
@@ -361,7 +266,7 @@ TEST_F(ZyrGroupHandlerTree, copiesAndFilesItsListsAndModeAndRefusesEveryTruncati
 }
 
 TEST_F(ZyrGroupHandlerTree, downgradesForTheScopeOnlyWhatWasOpenForWrite) {
-    ZyrDbTestGroup outside;
+    ZyrDbAreaGroup outside;
     EXPECT_EQ(ZyrWriteToRead(nullptr).status(), Hsys::eNullPointer);
     EXPECT_EQ(ZyrWriteToRead(&outside).status(), Hsys::eNotOpenForWrite);
     for (const HsDb::OpenMode mode : {HsDb::kForRead, HsDb::kForWrite}) {
@@ -377,31 +282,30 @@ TEST_F(ZyrGroupHandlerTree, downgradesForTheScopeOnlyWhatWasOpenForWrite) {
 
 TEST_F(ZyrGroupHandlerTree, aWalkIntoAGroupThatCannotBeOpenedEndsTheProcess) {
     const Tree t = tree();
-    HsDbObjectPointer<ZyrDbTestGroup> heldForWrite(t.A, HsDb::kForWrite);
+    HsDbObjectPointer<ZyrDbAreaGroup> heldForWrite(t.A, HsDb::kForWrite);
     EXPECT_DEATH(ask(t.R, [&](const ZyrGroupHandler& h) { return h.hasLeaf(t.l3); }), "");
 }
 
-TEST(ZyrGroupNodeTypes, labelsAModeWithTheNamesOfTheClassesItMayHold) {
-    ZyrAreaCalculationBaseTexts::registerTexts();
-    ZyrDecoratorManager::bindModule(gTestModule, ZyrAreaCalculationBaseApp::kAppName);
-    const auto text = [](unsigned int id) {
-        return ZyrAreaCalculationBaseApp::sStringFromResource(id, false);
-    };
-    HsRxClass* const group = ZyrDbTestGroup::desc();
-    HsRxClass* const leaf = ZyrDbTestLeaf::desc();
-    const std::tuple<unsigned short, HsRxClass*, HsRxClass*, ZyrRmCString> cases[] = {
-        {0, group, leaf, text(29057)},
-        {1, group, leaf, text(kGroupName)},
-        {2, group, leaf, text(kLeafName)},
-        {3, group, leaf, text(kGroupName) + L", " + text(kLeafName)},
-        {3, nullptr, nullptr, text(28987) + L", " + text(29007)},
-        {3, group, ZyrDbTestSubGroup::desc(), text(kGroupName) + L", "},
-        {4, group, leaf, L"kept"},
-    };
+// The group and area classes are named by their decorators, which give the very wordings that stand
+// for a missing class; a class without display texts shows that the decorator is asked.
+TEST_F(ZyrGroupHandlerTree, labelsAModeWithTheNamesOfTheClassesItMayHold) {
+    HsRxClass* const group = ZyrDbAreaGroup::desc();
+    HsRxClass* const area = ZyrDbArea::desc();
+    HsRxClass* const untitled = ZyrDbTestSubGroup::desc();
+    const std::tuple<unsigned short, HsRxClass*, HsRxClass*, const wchar_t*> cases[] = {
+        {0, group, area, L"No members"},
+        {1, group, area, L"Area Group"},
+        {2, group, area, L"Area"},
+        {3, group, area, L"Area Group, Area"},
+        {3, nullptr, nullptr, L"Area Group, Area"},
+        {3, group, untitled, L"Area Group, "},
+        {3, untitled, area, L"Area"},
+        {1, untitled, area, L""},
+        {4, group, area, L"kept"}};
     for (const auto& [mode, nodeClass, leafClass, expected] : cases) {
         ZyrRmCString out = L"kept";
         ZyrGroupNodeTypes::displayName(mode, nodeClass, leafClass, out);
-        EXPECT_EQ(out.str(), expected.str()) << mode;
+        EXPECT_EQ(out.str(), expected) << mode;
     }
 }
 
