@@ -125,19 +125,23 @@ void attachPerimeter(bool attach) {
               "the perimeter algorithm");
 }
 
+// The sum of the areas of the ids, each opened for read in turn.
+double sumOfAreas(const Ids& ids) {
+    double sum = 0.0;
+    for (const HsDbObjectId& id : ids) {
+        ZyrDbArea* area = nullptr;
+        if (ZyrDbArea::open(area, id, HsDb::kForRead) != Hsys::eSuccess)
+            continue;
+        sum += area->area();
+        area->close();
+    }
+    return sum;
+}
+
 void BM_OpenEveryArea(benchmark::State& state) {
     const Site& site = siteOf(static_cast<size_t>(state.range(0)));
-    for (auto _ : state) {
-        double sum = 0.0;
-        for (const HsDbObjectId& id : site.areas) {
-            ZyrDbArea* area = nullptr;
-            if (ZyrDbArea::open(area, id, HsDb::kForRead) != Hsys::eSuccess)
-                continue;
-            sum += area->area();
-            area->close();
-        }
-        benchmark::DoNotOptimize(sum);
-    }
+    for (auto _ : state)
+        benchmark::DoNotOptimize(sumOfAreas(site.areas));
     state.SetItemsProcessed(state.iterations() * state.range(0));
 }
 
@@ -148,13 +152,7 @@ void BM_OpenInNameOrder(benchmark::State& state) {
         for (const Ids& floor : site.floorRooms) {
             Ids rooms = floor;
             ZyrACFunctional::sortNamedObjects(rooms, static_cast<ZyrDbArea*>(nullptr));
-            for (const HsDbObjectId& id : rooms) {
-                ZyrDbArea* area = nullptr;
-                if (ZyrDbArea::open(area, id, HsDb::kForRead) != Hsys::eSuccess)
-                    continue;
-                sum += area->area();
-                area->close();
-            }
+            sum += sumOfAreas(rooms);
         }
         benchmark::DoNotOptimize(sum);
     }
