@@ -95,28 +95,12 @@ Hsys::ErrorStatus ZyrDbEntity::bdfOutOverrides(HsDbBdfFiler* filer) const {
 // Every override is read before the list is replaced, so a stream that fails leaves the list
 // as it was.
 Hsys::ErrorStatus ZyrDbEntity::bdfInOverrides(HsDbBdfFiler* filer) {
-    std::uint32_t count = 0;
-    if (filer->readUInt32(count) != Hsys::eSuccess)
-        return filer->filerStatus();
-    if (count > filer->remaining() / Zyr::kMinNestedObjectSize) {
-        filer->setFilerStatus(Hsys::eFilerError);
-        return Hsys::eFilerError;
-    }
     OwnedOverrides read;
-    read.reserve(count);
-    for (std::uint32_t i = 0; i < count; ++i) {
-        ZyrOverride* override = nullptr;
-        if (const Hsys::ErrorStatus status =
-                Zyr::readObject(filer, static_cast<HsDbObject*>(this), override,
-                                static_cast<unsigned short>(filedVersion()));
-            status != Hsys::eSuccess)
-            return status;
-        if (override == nullptr) {
-            filer->setFilerStatus(Hsys::eFilerError);
-            return Hsys::eFilerError;
-        }
-        read.emplace_back(override);
-    }
+    if (const Hsys::ErrorStatus status =
+            Zyr::readObjectList(filer, static_cast<HsDbObject*>(this),
+                                static_cast<unsigned short>(filedVersion()), read);
+        status != Hsys::eSuccess)
+        return status;
     deleteOverrides();
     m_overrides = zyrtl::releaseAll(read);
     return Hsys::eSuccess;

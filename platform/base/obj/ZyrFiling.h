@@ -2,12 +2,14 @@
 // nested implementation objects.
 #pragma once
 
+#include "platform/host/filer/HsDbBdfFiler.h"
 #include "platform/host/ut/HsysErrorStatus.h"
 
 #include <cstddef>
 #include <cstdint>
+#include <memory>
+#include <vector>
 
-class HsDbBdfFiler;
 class HsDbObject;
 class HsRxClass;
 class ZyrImpObj;
@@ -80,6 +82,36 @@ Hsys::ErrorStatus readObject(HsDbBdfFiler* filer, Owner* owner, T*& object,
     const Hsys::ErrorStatus status = readObjectOfClass(filer, owner, T::desc(), held, version);
     object = static_cast<T*>(held);
     return status;
+}
+
+// A list of nested objects of class T: uint32 count, then each object as readObject reads it.
+// The objects are appended to read in order. A count the rest of the stream cannot hold and an
+// empty place (kind 0) fail the filer with eFilerError; a failing object gives its status. On
+// any failure read holds what came before, for the caller to drop: the list it replaces stays
+// as it was.
+template <class T, class Owner>
+Hsys::ErrorStatus readObjectList(HsDbBdfFiler* filer, Owner* owner, unsigned short version,
+                                 std::vector<std::unique_ptr<T>>& read) {
+    std::uint32_t count = 0;
+    if (filer->readUInt32(count) != Hsys::eSuccess)
+        return filer->filerStatus();
+    if (count > filer->remaining() / kMinNestedObjectSize) {
+        filer->setFilerStatus(Hsys::eFilerError);
+        return Hsys::eFilerError;
+    }
+    read.reserve(read.size() + count);
+    for (std::uint32_t i = 0; i < count; ++i) {
+        T* object = nullptr;
+        if (const Hsys::ErrorStatus status = readObject(filer, owner, object, version);
+            status != Hsys::eSuccess)
+            return status;
+        if (object == nullptr) {
+            filer->setFilerStatus(Hsys::eFilerError);
+            return Hsys::eFilerError;
+        }
+        read.emplace_back(object);
+    }
+    return Hsys::eSuccess;
 }
 
 } // namespace Zyr

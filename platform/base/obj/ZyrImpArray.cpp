@@ -68,27 +68,11 @@ Hsys::ErrorStatus ZyrImpArray::bdfInFields(HsDbBdfFiler* filer) {
 }
 
 Hsys::ErrorStatus ZyrImpArray::bdfInOwnFields(HsDbBdfFiler* filer) {
-    std::uint32_t count = 0;
-    if (filer->readUInt32(count) != Hsys::eSuccess)
-        return filer->filerStatus();
-    if (count > filer->remaining() / Zyr::kMinNestedObjectSize) {
-        filer->setFilerStatus(Hsys::eFilerError);
-        return Hsys::eFilerError;
-    }
     OwnedEntries read;
-    read.reserve(count);
-    for (std::uint32_t i = 0; i < count; ++i) {
-        ZyrImpObj* entry = nullptr;
-        if (const Hsys::ErrorStatus status =
-                Zyr::readObject(filer, this, entry, static_cast<unsigned short>(filedVersion()));
-            status != Hsys::eSuccess)
-            return status;
-        if (entry == nullptr) {
-            filer->setFilerStatus(Hsys::eFilerError);
-            return Hsys::eFilerError;
-        }
-        read.emplace_back(entry);
-    }
+    if (const Hsys::ErrorStatus status = Zyr::readObjectList(
+            filer, this, static_cast<unsigned short>(filedVersion()), read);
+        status != Hsys::eSuccess)
+        return status;
     replaceEntries(zyrtl::releaseAll(read));
     return filer->filerStatus();
 }

@@ -211,6 +211,11 @@ TEST_F(ZyrImpArrayOf, hostileBinaryStreamsLeaveTheArrayAsItWas) {
         EXPECT_EQ(describe(array), (std::vector<std::wstring>{L"kept", L"ZyrGeProfile", L"second"}))
             << "length " << stream.size();
     }
+    // A count the bytes cannot hold is refused before any entry is reserved or read.
+    HsDbBdfFiler beyond(streams[bytes.size()], &filerDatabase);
+    ZyrImpArray array;
+    EXPECT_EQ(array.bdfInFields(&beyond), Hsys::eFilerError);
+    EXPECT_EQ(beyond.position(), 8u);
 }
 
 TEST_F(ZyrImpArrayOf, textStreamsOfAnotherArrayOrAnUnknownClassAreRefused) {
