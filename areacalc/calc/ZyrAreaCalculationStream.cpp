@@ -6,6 +6,7 @@
 #include "platform/host/ut/HsutConsole.h"
 
 #include <algorithm>
+#include <random>
 
 ZyrCalculationNodeData::~ZyrCalculationNodeData() = default;
 
@@ -83,19 +84,37 @@ ZyrModifierData* ZyrAreaCalculationStream::modifierData(const ZyrModifierBlock& 
     return m_modifierDatas[static_cast<size_t>(block.modifierIndex)];
 }
 
-size_t ZyrAreaCalculationStream::FirstPositions::slotOf(const HsDbObjectId& objectId) const {
-    // Entries are allocated objects: the low bits carry no information, the multiplication
-    // spreads the rest over the top bits, which pick the slot.
-    const auto bits = reinterpret_cast<std::uintptr_t>(objectId.entry());
-    const std::uint64_t mixed = static_cast<std::uint64_t>(bits) * 0x9E3779B97F4A7C15ull;
-    return static_cast<size_t>(mixed >> 32) & (m_slots.size() - 1);
+namespace {
+
+// Drawings are read from files, and files choose their handles: a salt no file can know keeps
+// crafted handles from piling up in one place of the table.
+std::uint64_t handleSalt() {
+    static const std::uint64_t salt = [] {
+        std::random_device device;
+        return (static_cast<std::uint64_t>(device()) << 32) | device();
+    }();
+    return salt;
+}
+
+} // namespace
+
+std::uint32_t ZyrAreaCalculationStream::FirstPositions::hashOf(const HsDbObjectId& objectId) {
+    // The members of a group are mostly made one after the other and pushed one after the
+    // other: runs of neighbouring handles keep neighbouring slots and share cache lines, while
+    // the multiplication scatters the runs over the table.
+    constexpr unsigned kRunBits = 4;
+    const std::uint64_t handle = objectId.handle();
+    const std::uint64_t run = ((handle >> kRunBits) ^ handleSalt()) * 0x9E3779B97F4A7C15ull;
+    return static_cast<std::uint32_t>(((run >> 32) << kRunBits) |
+                                      (handle & ((1u << kRunBits) - 1)));
 }
 
 bool ZyrAreaCalculationStream::FirstPositions::find(const HsDbObjectId& objectId,
                                                     int& index) const {
     if (m_slots.empty())
         return false;
-    for (size_t slot = slotOf(objectId);; slot = (slot + 1) & (m_slots.size() - 1)) {
+    const size_t mask = m_slots.size() - 1;
+    for (size_t slot = hashOf(objectId) & mask;; slot = (slot + 1) & mask) {
         const Slot& entry = m_slots[slot];
         if (entry.index < 0)
             return false;
@@ -107,14 +126,19 @@ bool ZyrAreaCalculationStream::FirstPositions::find(const HsDbObjectId& objectId
 }
 
 void ZyrAreaCalculationStream::FirstPositions::insert(const HsDbObjectId& objectId, int index) {
+    insert({objectId, index, hashOf(objectId)});
+}
+
+void ZyrAreaCalculationStream::FirstPositions::insert(const Slot& entry) {
     // At most half full, so that a probe ends soon on a free slot.
     if (2 * (m_used + 1) > m_slots.size())
         grow();
-    size_t slot = slotOf(objectId);
-    for (; m_slots[slot].index >= 0; slot = (slot + 1) & (m_slots.size() - 1))
-        if (m_slots[slot].objectId == objectId)
+    const size_t mask = m_slots.size() - 1;
+    size_t slot = entry.hash & mask;
+    for (; m_slots[slot].index >= 0; slot = (slot + 1) & mask)
+        if (m_slots[slot].objectId == entry.objectId)
             return;
-    m_slots[slot] = {objectId, index};
+    m_slots[slot] = entry;
     ++m_used;
 }
 
@@ -122,9 +146,10 @@ void ZyrAreaCalculationStream::FirstPositions::grow() {
     std::vector<Slot> old(std::max<size_t>(64, 2 * m_slots.size()));
     old.swap(m_slots);
     m_used = 0;
+    // The kept hashes spare a visit to every id's entry.
     for (const Slot& entry : old)
         if (entry.index >= 0)
-            insert(entry.objectId, entry.index);
+            insert(entry);
 }
 
 bool ZyrAreaCalculationStream::hasNodeHeaderFor(const HsDbObjectId& objectId, int& index) const {

@@ -164,8 +164,11 @@ private:
             HsDbObjectId objectId;
             // Negative while the slot is free.
             int index = -1;
+            // Picks the slot at any size of the table up to 2^32 slots.
+            std::uint32_t hash = 0;
         };
-        size_t slotOf(const HsDbObjectId& objectId) const;
+        static std::uint32_t hashOf(const HsDbObjectId& objectId);
+        void insert(const Slot& entry);
         void grow();
 
         std::vector<Slot> m_slots;

@@ -13,13 +13,18 @@ namespace {
 
 class ZyrAreaCalculationStreamTest : public testing::Test {
 protected:
-    HsDbObjectId id(std::uint64_t handle) {
+    static HsDbObjectId id(std::uint64_t handle, HsDbDatabase& in) {
         HsDbObjectId result;
-        EXPECT_EQ(database.getHsDbObjectId(result, true, handle), Hsys::eSuccess);
+        EXPECT_EQ(in.getHsDbObjectId(result, true, handle), Hsys::eSuccess);
         return result;
     }
+    HsDbObjectId id(std::uint64_t handle) { return id(handle, database); }
     static ZyrCalculationNode* node(int headerIndex, std::vector<int> dataIndices = {}) {
         return new ZyrCalculationNode{nullptr, headerIndex, {}, std::move(dataIndices)};
+    }
+    int header(const wchar_t* name, const HsDbObjectId& objectId) {
+        return writer.appendNodeHeader(
+            new ZyrCalculationNodeHeader{L"ZyrDbArea", objectId, name, L"", nullptr});
     }
     int header(const wchar_t* name, std::uint64_t handle, const wchar_t* description = L"") {
         return writer.appendNodeHeader(
@@ -49,24 +54,34 @@ template <class Table> int searchFromTheFront(const Table& table, const HsDbObje
 }
 
 TEST_F(ZyrAreaCalculationStreamTest, lookupsAnswerWhatASearchFromTheFrontAnswers) {
+    // Two drawings give their objects the same handles: equal handles are still other objects.
+    HsDbDatabase other;
+    HsDbDatabase* const databases[] = {&database, &other};
     std::mt19937 random(20240611);
-    std::uniform_int_distribution<std::uint64_t> handles(1, 40);
+    // Runs of neighbouring handles and scattered ones, enough for the lookups to grow.
+    std::uniform_int_distribution<std::uint64_t> handles(1, 1200);
+    std::uniform_int_distribution<int> which(0, 1);
+    const auto anyId = [&] { return id(handles(random), *databases[which(random)]); };
     // Two rounds: the lookups follow the tables through a reset as well.
     for (int round = 0; round < 2; ++round) {
         stream.reset();
-        for (int i = 0; i < 300; ++i) {
-            header(L"area", handles(random));
-            writer.appendModifierData(new ZyrModifierData{L"m", L"", id(handles(random)), L"x"});
+        for (int i = 0; i < 3000; ++i) {
+            header(L"area", anyId());
+            writer.appendModifierData(new ZyrModifierData{L"m", L"", anyId(), L"x"});
         }
-        for (std::uint64_t handle = 1; handle <= 45; ++handle) {
-            const int expectedHeader = searchFromTheFront(stream.nodeHeaderVector(), id(handle));
-            const int expectedModifier =
-                searchFromTheFront(stream.modifierDataVector(), id(handle));
-            int headerIndex = -1, modifierIndex = -1;
-            EXPECT_EQ(stream.hasNodeHeaderFor(id(handle), headerIndex), expectedHeader >= 0);
-            EXPECT_EQ(stream.hasModifierDataFor(id(handle), modifierIndex), expectedModifier >= 0);
-            EXPECT_EQ(headerIndex, expectedHeader) << handle;
-            EXPECT_EQ(modifierIndex, expectedModifier) << handle;
+        for (HsDbDatabase* in : databases) {
+            for (std::uint64_t handle = 1; handle <= 1205; ++handle) {
+                const HsDbObjectId objectId = id(handle, *in);
+                const int expectedHeader = searchFromTheFront(stream.nodeHeaderVector(), objectId);
+                const int expectedModifier =
+                    searchFromTheFront(stream.modifierDataVector(), objectId);
+                int headerIndex = -1, modifierIndex = -1;
+                EXPECT_EQ(stream.hasNodeHeaderFor(objectId, headerIndex), expectedHeader >= 0);
+                EXPECT_EQ(stream.hasModifierDataFor(objectId, modifierIndex),
+                          expectedModifier >= 0);
+                EXPECT_EQ(headerIndex, expectedHeader) << handle;
+                EXPECT_EQ(modifierIndex, expectedModifier) << handle;
+            }
         }
     }
 }
