@@ -40,7 +40,10 @@ template <class Parent> HsRxClass* parentClass() {
 #define ZYR_AREACALC_DECLARE_MEMBERS(CLASS)                                                        \
 public:                                                                                            \
     static HsRxClass* rxInit();                                                                    \
-    static HsRxClass* desc();                                                                      \
+    static HsRxClass* desc() {                                                                     \
+        return gpDesc != nullptr ? gpDesc                                                          \
+                                 : ZyrAreaCalculationClassRegistration::desc(gpDesc, L"" #CLASS);  \
+    }                                                                                              \
     HsRxClass* isA() const override;                                                               \
     static CLASS* cast(const HsRxObject* object) {                                                 \
         return object != nullptr && object->isKindOf(desc())                                       \
@@ -53,12 +56,9 @@ private:                                                                        
                                                                                                    \
 public:
 
-// What every class of the module defines after its rxInit: desc and isA through the cached
-// descriptor, and the decorator that registers the class with the module.
-#define ZYR_AREACALC_DEFINE_DESC_AND_DECORATOR(CLASS, PARENT, NAME_ID, SECOND_ID)                  \
-    HsRxClass* CLASS::desc() {                                                                     \
-        return ZyrAreaCalculationClassRegistration::desc(gpDesc, L"" #CLASS);                      \
-    }                                                                                              \
+// What every class of the module defines after its rxInit: isA through the cached descriptor, and
+// the decorator that registers the class with the module.
+#define ZYR_AREACALC_DEFINE_ISA_AND_DECORATOR(CLASS, PARENT, NAME_ID, SECOND_ID)                   \
     HsRxClass* CLASS::isA() const {                                                                \
         return CLASS::desc();                                                                      \
     }                                                                                              \
@@ -74,4 +74,4 @@ public:
             gpDesc, L"" #CLASS, ZyrAreaCalculationClassRegistration::parentClass<PARENT>(), FLAGS, \
             CONSTRUCTOR);                                                                          \
     }                                                                                              \
-    ZYR_AREACALC_DEFINE_DESC_AND_DECORATOR(CLASS, PARENT, NAME_ID, SECOND_ID)
+    ZYR_AREACALC_DEFINE_ISA_AND_DECORATOR(CLASS, PARENT, NAME_ID, SECOND_ID)

@@ -353,7 +353,8 @@ void ZyrDbArea::getLayerKey(ZyrRmCString& key) const {
 
 ZyrRmCString ZyrDbArea::name() const {
     assertReadEnabled();
-    return areaImp() != nullptr ? areaImp()->areaName() : ZyrRmCString();
+    const ZyrImpArea* imp = areaImp();
+    return imp != nullptr ? imp->areaName() : ZyrRmCString();
 }
 
 Hsys::ErrorStatus ZyrDbArea::setName(const ZyrRmCString& name) {
@@ -362,7 +363,8 @@ Hsys::ErrorStatus ZyrDbArea::setName(const ZyrRmCString& name) {
 
 double ZyrDbArea::area() const {
     assertReadEnabled();
-    return areaImp() != nullptr ? areaImp()->area() : 0.0;
+    const ZyrImpArea* imp = areaImp();
+    return imp != nullptr ? imp->area() : 0.0;
 }
 
 double ZyrDbArea::perimeter() const {

@@ -155,4 +155,4 @@ private:
             CLASS::kProxyFlags, hsrxInstantiateClass<CLASS>, RECORD_NAME,                          \
             ZyrAreaCalculationBaseApp::kClassAppDescription, appDataCallback);                     \
     }                                                                                              \
-    ZYR_AREACALC_DEFINE_DESC_AND_DECORATOR(CLASS, PARENT, NAME_ID, SECOND_ID)
+    ZYR_AREACALC_DEFINE_ISA_AND_DECORATOR(CLASS, PARENT, NAME_ID, SECOND_ID)

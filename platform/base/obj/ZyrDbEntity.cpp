@@ -164,14 +164,6 @@ bool ZyrDbEntity::isModelGeometry() const {
     return false;
 }
 
-ZyrImpEnt* ZyrDbEntity::imp() {
-    return static_cast<ZyrImpEnt*>(ownedImp());
-}
-
-const ZyrImpEnt* ZyrDbEntity::imp() const {
-    return static_cast<const ZyrImpEnt*>(ownedImp());
-}
-
 void ZyrDbEntity::setImp(ZyrImpEnt* imp) {
     assertWriteEnabled();
     replaceImp(imp);

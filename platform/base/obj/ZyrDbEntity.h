@@ -2,6 +2,7 @@
 #pragma once
 
 #include "platform/base/obj/ZyrDbImpOwner.h"
+#include "platform/base/obj/ZyrImpEnt.h"
 #include "platform/host/db/HsDbEntity.h"
 
 #include <cstdint>
@@ -10,7 +11,6 @@
 struct _GUID;
 class HsGePlane;
 class ZyrGeProfile;
-class ZyrImpEnt;
 class ZyrOverride;
 class ZyrRmCString;
 
@@ -54,8 +54,9 @@ public:
     // Whether the entity is geometry of the model (as opposed to an annotation); false here.
     virtual bool isModelGeometry() const;
 
-    ZyrImpEnt* imp();
-    const ZyrImpEnt* imp() const;
+    // Inline: every reading of an entity's state passes here.
+    ZyrImpEnt* imp() { return static_cast<ZyrImpEnt*>(ownedImp()); }
+    const ZyrImpEnt* imp() const { return static_cast<const ZyrImpEnt*>(ownedImp()); }
     // Deletes the held implementation object and takes imp (null leaves none). Needs write.
     void setImp(ZyrImpEnt* imp);
 

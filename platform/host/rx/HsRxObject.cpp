@@ -9,7 +9,9 @@ HsRxClass* HsRxObject::desc() {
     return descriptor;
 }
 
-HsRxClass* HsRxObject::isA() const { return HsRxObject::desc(); }
+HsRxClass* HsRxObject::isA() const {
+    return HsRxObject::desc();
+}
 
 HsRxObject* HsRxObject::clone() const {
     HsRxObject* copy = isA()->create();
@@ -22,17 +24,25 @@ HsRxObject* HsRxObject::clone() const {
     return copy;
 }
 
-Hsys::ErrorStatus HsRxObject::copyFrom(const HsRxObject* /*other*/) { return Hsys::eNotImplemented; }
+Hsys::ErrorStatus HsRxObject::copyFrom(const HsRxObject* /*other*/) {
+    return Hsys::eNotImplemented;
+}
 
-bool HsRxObject::isEqualTo(const HsRxObject* other) const { return other == this; }
+bool HsRxObject::isEqualTo(const HsRxObject* other) const {
+    return other == this;
+}
 
-HsRx::Ordering HsRxObject::comparedTo(const HsRxObject* /*other*/) const { return HsRx::eNotOrderable; }
+HsRx::Ordering HsRxObject::comparedTo(const HsRxObject* /*other*/) const {
+    return HsRx::eNotOrderable;
+}
 
 HsRxObject* HsRxObject::subQueryX(const HsRxClass* protocolClass) const {
     return isKindOf(protocolClass) ? const_cast<HsRxObject*>(this) : nullptr;
 }
 
-bool HsRxObject::isKindOf(const HsRxClass* cls) const { return isA()->isDerivedFrom(cls); }
+bool HsRxObject::isDerivedFrom(const HsRxClass* own, const HsRxClass* cls) {
+    return own->isDerivedFrom(cls);
+}
 
 HsRxClass* hsrxRegisterOnce(const wchar_t* name, HsRxClass* parent, int proxyFlags,
                             HsRxObject* (*constructor)()) {

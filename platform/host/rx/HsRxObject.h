@@ -17,7 +17,7 @@ public:                                                                         
     HsRxClass* isA() const override;                                                               \
     static CLASS* cast(const HsRxObject* object) {                                                 \
         return object != nullptr && object->isKindOf(desc())                                       \
-                   ? static_cast<CLASS*>(const_cast<HsRxObject*>(object))                         \
+                   ? static_cast<CLASS*>(const_cast<HsRxObject*>(object))                          \
                    : nullptr;                                                                      \
     }
 
@@ -30,7 +30,9 @@ public:                                                                         
             hsrxRegisterOnce(L"" #CLASS, PARENT::desc(), PROXY_FLAGS, CONSTRUCTOR);                \
         return descriptor;                                                                         \
     }                                                                                              \
-    HsRxClass* CLASS::isA() const { return CLASS::desc(); }                                        \
+    HsRxClass* CLASS::isA() const {                                                                \
+        return CLASS::desc();                                                                      \
+    }                                                                                              \
     [[maybe_unused]] static HsRxClass* const gHsRxRegisteredAtLoad##CLASS = CLASS::desc();
 
 class HsRxObject {
@@ -55,12 +57,21 @@ public:
 
     static HsRxClass* desc();
     static HsRxObject* cast(const HsRxObject* object) { return const_cast<HsRxObject*>(object); }
-    bool isKindOf(const HsRxClass* cls) const;
+    bool isKindOf(const HsRxClass* cls) const {
+        // Most casts ask for the object's own class, which needs no walk up the parents.
+        const HsRxClass* own = isA();
+        return own == cls || isDerivedFrom(own, cls);
+    }
     HsRxObject* queryX(const HsRxClass* protocolClass) const { return subQueryX(protocolClass); }
+
+private:
+    static bool isDerivedFrom(const HsRxClass* own, const HsRxClass* cls);
 };
 
 // The usual pseudo constructor of a class: a default-constructed object.
-template <class T> HsRxObject* hsrxInstantiateClass() { return new T(); }
+template <class T> HsRxObject* hsrxInstantiateClass() {
+    return new T();
+}
 
 // Finds a class by name or registers it under that parent; used by HSRX_DEFINE_MEMBERS.
 HsRxClass* hsrxRegisterOnce(const wchar_t* name, HsRxClass* parent, int proxyFlags,
