@@ -362,7 +362,7 @@ void ZyrAreaCalculationEngine::foldIntoParent(
         // evaluate adds nothing.
         const auto match = std::find_if(
             parentData.begin(), parentData.end(), [data](const ZyrCalculationNodeData* candidate) {
-                return candidate->algorithmClassName.str() == data->algorithmClassName.str();
+                return candidate->algorithmClassName == data->algorithmClassName;
             });
         if (match == parentData.end())
             continue;

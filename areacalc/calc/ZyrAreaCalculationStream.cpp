@@ -12,7 +12,7 @@ ZyrCalculationNodeData::~ZyrCalculationNodeData() = default;
 
 bool StreamContentCheckerOidAndString::operator()(const ZyrCalculationNodeData* data) const {
     return data != nullptr && data->objectId == m_objectId &&
-           data->algorithmClassName.str() == m_className.str();
+           data->algorithmClassName == m_className;
 }
 
 void deleteTreeNode(ZyrCalculationNode*& node) {

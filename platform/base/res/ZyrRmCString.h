@@ -56,10 +56,17 @@ public:
         writable() += c;
         return *this;
     }
-    friend ZyrRmCString operator+(ZyrRmCString left, const ZyrRmCString& right) { return left += right; }
-    friend bool operator==(const ZyrRmCString& a, const ZyrRmCString& b) { return a.str() == b.str(); }
+    friend ZyrRmCString operator+(ZyrRmCString left, const ZyrRmCString& right) {
+        return left += right;
+    }
+    // Copies of one text share its buffer and are equal without a look at the characters.
+    friend bool operator==(const ZyrRmCString& a, const ZyrRmCString& b) {
+        return a.m_text == b.m_text || a.str() == b.str();
+    }
     friend bool operator==(const ZyrRmCString& a, const wchar_t* b) { return a.Compare(b) == 0; }
-    friend auto operator<=>(const ZyrRmCString& a, const ZyrRmCString& b) { return a.str() <=> b.str(); }
+    friend auto operator<=>(const ZyrRmCString& a, const ZyrRmCString& b) {
+        return a.str() <=> b.str();
+    }
 
 private:
     static const std::wstring& emptyText();
