@@ -18,11 +18,11 @@ void* Entity::operator new(std::size_t size) {
     return memory;
 }
 
-void Entity::operator delete(void* memory, std::size_t size) noexcept {
+void Entity::operator delete(void* memory) noexcept {
     if (memory == nullptr)
         return;
     gLiveEntities.fetch_sub(1, std::memory_order_relaxed);
-    ::operator delete(memory, size);
+    ::operator delete(memory);
 }
 
 std::size_t Entity::liveCount() noexcept {

@@ -15,7 +15,7 @@ public:
     Entity& operator=(const Entity&) = delete;
 
     static void* operator new(std::size_t size);
-    static void operator delete(void* memory, std::size_t size) noexcept;
+    static void operator delete(void* memory) noexcept;
 
     // Entities allocated with new and not yet deleted, in the whole process: a leak shows here.
     static std::size_t liveCount() noexcept;
