@@ -6,7 +6,7 @@
 #include "platform/host/ut/HsutConsole.h"
 
 #include <algorithm>
-#include <random>
+#include <chrono>
 
 ZyrCalculationNodeData::~ZyrCalculationNodeData() = default;
 
@@ -87,12 +87,12 @@ ZyrModifierData* ZyrAreaCalculationStream::modifierData(const ZyrModifierBlock& 
 namespace {
 
 // Drawings are read from files, and files choose their handles: a salt no file can know keeps
-// crafted handles from piling up in one place of the table.
+// crafted handles from piling up in one place of the table. The clock at first use and where the
+// loader placed this library differ from run to run; neither can fail the way a random device can.
 std::uint64_t handleSalt() {
-    static const std::uint64_t salt = [] {
-        std::random_device device;
-        return (static_cast<std::uint64_t>(device()) << 32) | device();
-    }();
+    static const std::uint64_t salt =
+        static_cast<std::uint64_t>(std::chrono::steady_clock::now().time_since_epoch().count()) ^
+        static_cast<std::uint64_t>(reinterpret_cast<std::uintptr_t>(&handleSalt));
     return salt;
 }
 
