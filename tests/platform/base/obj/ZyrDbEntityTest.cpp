@@ -7,67 +7,35 @@
 #include "platform/host/db/HsDbObjectPointer.h"
 #include "platform/host/ge/HsGeBoundBlock3d.h"
 #include "platform/host/ge/HsGePlane.h"
-#include "platform/host/ut/HsutUtf8.h"
 
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <filesystem>
 #include <limits>
-#include <unistd.h>
 
 namespace {
 
-namespace fs = std::filesystem;
-
 class ZyrDbEntityPair : public ::testing::Test {
 protected:
-    void TearDown() override {
-        std::error_code ignored;
-        fs::remove(path, ignored);
-    }
+    HsDbObjectId add(HsDbObject* object) { return addClosed(database, object); }
 
-    HsDbObjectId add(HsDbObject* object) {
-        HsDbObjectId id;
-        EXPECT_EQ(database.addHsDbObject(id, object), Hsys::eSuccess);
-        object->close();
-        return id;
-    }
-
-    // A shape with a translated ECS, a member, a square profile and an override of two records.
-    HsDbObjectId addShape(const std::vector<HsDbObjectId>& records, const HsDbObjectId& member) {
-        auto* shape = new ZyrDbSampleShape;
+    // A shape with a translated ECS, members, a 2 by 2 square profile and the records' override.
+    HsDbObjectId addShape(const std::vector<HsDbObjectId>& records,
+                          const std::vector<HsDbObjectId>& members = {}) {
+        ZyrDbSampleShape* shape = newSampleShape(members, records);
         EXPECT_EQ(shape->setEcs(HsGeMatrix3d::translation({5, 6, 0})), Hsys::eSuccess);
-        EXPECT_EQ(shape->shapeImp()->addMember(member), Hsys::eSuccess);
-        auto* square = new ZyrGeProfile;
         auto* ring = new ZyrGeRing;
         const HsGePoint2d corners[] = {{0, 0}, {2, 0}, {2, 2}, {0, 2}};
         for (int i = 0; i < 4; ++i)
             EXPECT_EQ(ring->addSegment(new ZyrGeSegment2d(corners[i], corners[(i + 1) % 4], 0.0)),
                       Hsys::eSuccess);
+        auto* square = new ZyrGeProfile;
         EXPECT_EQ(square->addRing(ring), Hsys::eSuccess);
         shape->shapeImp()->setProfile(square);
-        auto* override = new ZyrSampleOverride;
-        for (const HsDbObjectId& record : records)
-            override->add(record);
-        EXPECT_EQ(shape->appendOverride(override), Hsys::eSuccess);
         return add(shape);
     }
 
-    // The drawing saved and read into a new database.
-    std::unique_ptr<HsDbDatabase> savedAndLoaded() {
-        path = fs::temp_directory_path() /
-               ("zyr-entity-" + std::to_string(::getpid()) + "-" +
-                ::testing::UnitTest::GetInstance()->current_test_info()->name() + ".zyrd");
-        const std::wstring file = hsutFromUtf8(path.string());
-        EXPECT_EQ(database.saveAs(file.c_str()), Hsys::eSuccess);
-        auto loaded = std::make_unique<HsDbDatabase>(HsDb::kEmptyDatabase);
-        EXPECT_EQ(loaded->readDrawingFile(file.c_str()), Hsys::eSuccess);
-        return loaded;
-    }
-
     HsDbDatabase database;
-    fs::path path;
 };
 
 TEST_F(ZyrDbEntityPair, overridesAreOwnedInOrderAndRefuseTwins) {
@@ -91,11 +59,12 @@ TEST_F(ZyrDbEntityPair, everythingSurvivesADrawingFileSaveAndLoad) {
     const HsDbObjectId a = add(new ZyrDbSampleRecord);
     const HsDbObjectId b = add(new ZyrDbSampleRecord);
     const HsDbObjectId member = add(new ZyrDbSampleShape);
-    const HsDbObjectId id = addShape({a, b, a}, member);
-
-    std::unique_ptr<HsDbDatabase> loaded = savedAndLoaded();
+    const HsDbObjectId id = addShape({a, b, a}, {member});
+    const ZyrScratchDrawing drawing;
+    HsDbDatabase loaded(HsDb::kEmptyDatabase);
+    ASSERT_EQ(loaded.readDrawingFile(drawing.savedFrom(database).c_str()), Hsys::eSuccess);
     HsDbObjectId loadedId;
-    ASSERT_EQ(loaded->getHsDbObjectId(loadedId, false, id.handle()), Hsys::eSuccess);
+    ASSERT_EQ(loaded.getHsDbObjectId(loadedId, false, id.handle()), Hsys::eSuccess);
     HsDbObjectPointer<ZyrDbSampleShape> shape(loadedId, HsDb::kForRead);
     ASSERT_TRUE(shape) << Hsys::toString(shape.openStatus());
     ASSERT_EQ(shape->overrideCount(), 1);
@@ -115,7 +84,7 @@ TEST_F(ZyrDbEntityPair, everythingSurvivesADrawingFileSaveAndLoad) {
 }
 
 TEST_F(ZyrDbEntityPair, aNestedClassThisBuildDoesNotKnowRefusesTheEntityAsOfALaterVersion) {
-    const HsDbObjectId id = addShape({}, HsDbObjectId());
+    const HsDbObjectId id = addShape({add(new ZyrDbSampleRecord)});
     HsDbBdfFiler writer(&database);
     {
         HsDbObjectPointer<ZyrDbSampleShape> shape(id, HsDb::kForRead);
@@ -137,7 +106,7 @@ TEST_F(ZyrDbEntityPair, aNestedClassThisBuildDoesNotKnowRefusesTheEntityAsOfALat
 
 TEST_F(ZyrDbEntityPair, copyClonesOverridesAndTheImplementation) {
     const HsDbObjectId record = add(new ZyrDbSampleRecord);
-    const HsDbObjectId id = addShape({record}, HsDbObjectId());
+    const HsDbObjectId id = addShape({record});
     HsDbObjectPointer<ZyrDbSampleShape> source(id, HsDb::kForRead);
     ZyrDbSampleShape copy;
     ASSERT_EQ(copy.copyFrom(source.object()), Hsys::eSuccess);
@@ -156,7 +125,7 @@ TEST_F(ZyrDbEntityPair, auditOfOverridesCountsAndRemovesBadRecords) {
     const HsDbObjectId good = add(new ZyrDbSampleRecord);
     const HsDbObjectId erased = add(new ZyrDbSampleRecord);
     const HsDbObjectId wrongClass = add(new ZyrDbSampleShape);
-    const HsDbObjectId id = addShape({erased, good, wrongClass}, HsDbObjectId());
+    const HsDbObjectId id = addShape({erased, good, wrongClass});
     ASSERT_EQ(HsDbObjectPointer<ZyrDbSampleRecord>(erased, HsDb::kForWrite)->erase(),
               Hsys::eSuccess);
     HsDbAuditInfo check(false);

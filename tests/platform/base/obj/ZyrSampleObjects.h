@@ -1,7 +1,7 @@
 // Sample classes built on the object bases the way the module builds its own: a record pair, an
-// entity pair with members and a nested profile, and an override that lists records. The public
-// classes add no fields and file no level of their own. Included by one test file per
-// executable, which registers the classes on first use.
+// entity pair with members and a nested profile, and an override that lists records; the public
+// classes add no fields and file no level of their own. Also the helpers that store them. Included
+// by one test file per executable, which registers the classes on first use.
 #pragma once
 
 #include "platform/base/geom/ZyrGeProfile.h"
@@ -17,14 +17,18 @@
 #include "platform/base/relgraph/ZyrObjReferenceMap.h"
 #include "platform/base/summary/ZyrDesc.h"
 #include "platform/host/db/HsDbAuditInfo.h"
+#include "platform/host/db/HsDbDatabase.h"
 #include "platform/host/filer/HsDbBdfFiler.h"
 #include "platform/host/filer/HsDbFilerSupport.h"
 #include "platform/host/rx/HsRxClass.h"
+#include "platform/host/ut/HsutUtf8.h"
 
+#include <gtest/gtest.h>
+
+#include <filesystem>
 #include <string>
+#include <unistd.h>
 #include <vector>
-
-// ---- a record: a width and the style it uses ----
 
 class ZyrImpSampleRecord : public ZyrImpDictRecord {
     HSRX_DECLARE_MEMBERS(ZyrImpSampleRecord)
@@ -133,8 +137,6 @@ public:
 
 HSRX_DEFINE_MEMBERS(ZyrDbSampleRecord, ZyrDbDictRecord, 0, hsrxInstantiateClass<ZyrDbSampleRecord>)
 
-// ---- an entity: members it holds, and a nested profile ----
-
 class ZyrImpSampleShape : public ZyrImpGeo {
     HSRX_DECLARE_MEMBERS(ZyrImpSampleShape)
 
@@ -211,8 +213,6 @@ public:
 
 HSRX_DEFINE_MEMBERS(ZyrDbSampleShape, ZyrDbGeo, 0, hsrxInstantiateClass<ZyrDbSampleShape>)
 
-// ---- an override: records in order, as modifiers are attached ----
-
 class ZyrSampleOverride : public ZyrOverride {
     HSRX_DECLARE_MEMBERS(ZyrSampleOverride)
 
@@ -283,3 +283,51 @@ private:
 };
 
 HSRX_DEFINE_MEMBERS(ZyrSampleOverride, ZyrOverride, 0, hsrxInstantiateClass<ZyrSampleOverride>)
+
+// Stores object in db and closes it, as a command does once it has built an object.
+inline HsDbObjectId addClosed(HsDbDatabase& db, HsDbObject* object) {
+    HsDbObjectId id;
+    EXPECT_EQ(db.addHsDbObject(id, object), Hsys::eSuccess);
+    object->close();
+    return id;
+}
+
+// A shape holding members and, when there are records, one override that lists them.
+inline ZyrDbSampleShape* newSampleShape(const std::vector<HsDbObjectId>& members,
+                                        const std::vector<HsDbObjectId>& records) {
+    auto* shape = new ZyrDbSampleShape;
+    for (const HsDbObjectId& member : members)
+        EXPECT_EQ(shape->shapeImp()->addMember(member), Hsys::eSuccess);
+    if (records.empty())
+        return shape;
+    auto* override = new ZyrSampleOverride;
+    for (const HsDbObjectId& record : records)
+        override->add(record);
+    EXPECT_EQ(shape->appendOverride(override), Hsys::eSuccess);
+    return shape;
+}
+
+// A drawing file named after the running test, so that test executables run side by side; it
+// goes when the test ends.
+class ZyrScratchDrawing {
+public:
+    ZyrScratchDrawing()
+        : m_path(std::filesystem::temp_directory_path() /
+                 ("zyr-" + std::to_string(::getpid()) + "-" +
+                  ::testing::UnitTest::GetInstance()->current_test_info()->name() + ".zyrd")) {}
+    ~ZyrScratchDrawing() {
+        std::error_code ignored;
+        std::filesystem::remove(m_path, ignored);
+    }
+    ZyrScratchDrawing(const ZyrScratchDrawing&) = delete;
+    ZyrScratchDrawing& operator=(const ZyrScratchDrawing&) = delete;
+
+    std::wstring savedFrom(HsDbDatabase& database) const {
+        const std::wstring file = hsutFromUtf8(m_path.string());
+        EXPECT_EQ(database.saveAs(file.c_str()), Hsys::eSuccess);
+        return file;
+    }
+
+private:
+    std::filesystem::path m_path;
+};

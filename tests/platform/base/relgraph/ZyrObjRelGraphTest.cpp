@@ -12,12 +12,7 @@
 
 #include <gtest/gtest.h>
 
-#include <filesystem>
-#include <unistd.h>
-
 namespace {
-
-namespace fs = std::filesystem;
 
 AFX_EXTENSION_MODULE gExtension;
 
@@ -48,20 +43,13 @@ protected:
     void SetUp() override { ASSERT_EQ(ZyrBaseServices::registerService(&app), Hsys::eSuccess); }
     void TearDown() override {
         EXPECT_EQ(ZyrBaseServices::unRegisterService(&app), Hsys::eSuccess);
-        std::error_code ignored;
-        fs::remove(path, ignored);
     }
 
     static ZyrObjRelGraph* graphOf(HsDbDatabase& db) {
         return ZyrBaseServices::service()->objRelGraph(&db);
     }
 
-    HsDbObjectId add(HsDbObject* object) {
-        HsDbObjectId id;
-        EXPECT_EQ(database.addHsDbObject(id, object), Hsys::eSuccess);
-        object->close();
-        return id;
-    }
+    HsDbObjectId add(HsDbObject* object) { return addClosed(database, object); }
     HsDbObjectId addRecord(const HsDbObjectId& style = HsDbObjectId()) {
         auto* record = new ZyrDbSampleRecord;
         EXPECT_EQ(record->sampleImp()->setStyleId(style), Hsys::eSuccess);
@@ -69,16 +57,7 @@ protected:
     }
     HsDbObjectId addShape(const std::vector<HsDbObjectId>& members,
                           const std::vector<HsDbObjectId>& records = {}) {
-        auto* shape = new ZyrDbSampleShape;
-        for (const HsDbObjectId& member : members)
-            EXPECT_EQ(shape->shapeImp()->addMember(member), Hsys::eSuccess);
-        if (!records.empty()) {
-            auto* override = new ZyrSampleOverride;
-            for (const HsDbObjectId& record : records)
-                override->add(record);
-            EXPECT_EQ(shape->appendOverride(override), Hsys::eSuccess);
-        }
-        return add(shape);
+        return add(newSampleShape(members, records));
     }
 
     // Who refers to the object of handle in db.
@@ -114,16 +93,9 @@ protected:
                   Hsys::eSuccess);
     }
 
-    std::wstring save() {
-        path = fs::temp_directory_path() / ("zyr-relgraph-" + std::to_string(::getpid()) + ".zyrd");
-        const std::wstring file = hsutFromUtf8(path.string());
-        EXPECT_EQ(database.saveAs(file.c_str()), Hsys::eSuccess);
-        return file;
-    }
-
     ZyrAppHdx app{L"GraphTest80", nullptr, gExtension, L"GraphTest"};
     HsDbDatabase database;
-    fs::path path;
+    const ZyrScratchDrawing drawing;
 };
 
 TEST_F(ZyrObjRelGraphOf, answersWhoRefersInHandleOrderWithTheRelationType) {
@@ -191,7 +163,7 @@ TEST_F(ZyrObjRelGraphOf, aSavedAndLoadedDrawingAnswersTheSame) {
     const HsDbObjectId group = addShape({member}, {style});
     const HsDbObjectId erased = addShape({member});
     setErased(erased, true);
-    const std::wstring file = save();
+    const std::wstring file = drawing.savedFrom(database);
     // One graph is made before the load and learns it as it happens; one after it.
     HsDbDatabase before(HsDb::kEmptyDatabase);
     ASSERT_NE(graphOf(before), nullptr);
@@ -257,10 +229,7 @@ TEST_F(ZyrObjRelGraphOf, aHandOverGivesTheIdTheNewObjectsClassAndReferences) {
 
 TEST_F(ZyrObjRelGraphOf, referencesIntoAnotherDrawingAreNoEdges) {
     HsDbDatabase other;
-    HsDbObjectId foreign;
-    auto* record = new ZyrDbSampleRecord;
-    ASSERT_EQ(other.addHsDbObject(foreign, record), Hsys::eSuccess);
-    record->close();
+    const HsDbObjectId foreign = addClosed(other, new ZyrDbSampleRecord);
     addShape({foreign});
     EXPECT_TRUE(referrersOf(other, foreign.handle()).empty());
     HsDbObjectPointer<HsDbObject> object(foreign, HsDb::kForRead);
@@ -284,7 +253,7 @@ TEST_F(ZyrObjRelGraphOf, aGraphGoesWithItsDatabaseAndWithTheService) {
     // A drawing that fails at its last object is dropped whole, and its graph with it.
     addShape({addShape({})});
     add(new ZyrDbUnreadable);
-    const std::wstring file = save();
+    const std::wstring file = drawing.savedFrom(database);
     HsDbDatabase failing(HsDb::kEmptyDatabase);
     ZyrObjRelGraph* failingGraph = graphOf(failing);
     gFailReads = true;
