@@ -11,6 +11,7 @@
 #include <gtest/gtest.h>
 
 #include <memory>
+#include <tuple>
 
 namespace {
 
@@ -72,9 +73,6 @@ TEST_F(HsDbDatabaseTest, dictionariesNestAndFindNamesWithoutRegardToCase) {
 
     EXPECT_EQ(dictionary->setName(L"standard", L"B\u00fcro"), Hsys::eDuplicateName);
     EXPECT_EQ(dictionary->setName(L"standard", L"Normal"), Hsys::eSuccess);
-    std::wstring name;
-    EXPECT_EQ(dictionary->nameAt(standard, name), Hsys::eSuccess);
-    EXPECT_EQ(name, L"Normal");
     EXPECT_EQ(dictionary->entries(), (std::vector<std::pair<std::wstring, HsDbObjectId>>{
                                          {L"B\u00fcro", office}, {L"Normal", standard}}));
 
@@ -118,11 +116,8 @@ TEST_F(HsDbDatabaseTest, symbolTablesKeepNamesUniqueAndRecordsOfTheirKind) {
 }
 
 TEST_F(HsDbDatabaseTest, valuesConvertIntoTheDisplayUnits) {
-    struct Case {
-        HsDb::UnitsValue drawing, display;
-        double length, area;
-    };
-    const Case cases[] = {
+    // Drawing and display units, and what one length and one area unit become.
+    const std::tuple<HsDb::UnitsValue, HsDb::UnitsValue, double, double> cases[] = {
         {HsDb::kUnitsMillimeters, HsDb::kUnitsMeters, 0.001, 1e-6},
         {HsDb::kUnitsCentimeters, HsDb::kUnitsMeters, 0.01, 1e-4},
         {HsDb::kUnitsMeters, HsDb::kUnitsMillimeters, 1000.0, 1e6},
@@ -130,12 +125,12 @@ TEST_F(HsDbDatabaseTest, valuesConvertIntoTheDisplayUnits) {
         {HsDb::kUnitsUnitless, HsDb::kUnitsMillimeters, 1.0, 1.0},
         {HsDb::kUnitsKilometers, HsDb::kUnitsUnitless, 1.0, 1.0},
     };
-    for (const Case& c : cases) {
-        SCOPED_TRACE(std::string(HsDb::toString(c.drawing)) + " to " + HsDb::toString(c.display));
-        db.setDrawingUnits(c.drawing);
-        db.setDisplayUnits(c.display);
-        EXPECT_NEAR(db.lengthInDisplayUnits(1.0), c.length, c.length * 1e-12);
-        EXPECT_NEAR(db.areaInDisplayUnits(1.0), c.area, c.area * 1e-12);
+    for (const auto& [drawing, display, length, area] : cases) {
+        SCOPED_TRACE(std::string(HsDb::toString(drawing)) + " to " + HsDb::toString(display));
+        db.setDrawingUnits(drawing);
+        db.setDisplayUnits(display);
+        EXPECT_NEAR(db.lengthInDisplayUnits(1.0), length, length * 1e-12);
+        EXPECT_NEAR(db.areaInDisplayUnits(1.0), area, area * 1e-12);
     }
     EXPECT_EQ(db.setDisplayPrecision(9), Hsys::eBadArgument);
     EXPECT_EQ(db.displayPrecision(), 2);

@@ -8,6 +8,7 @@
 
 #include <limits>
 #include <numbers>
+#include <tuple>
 
 namespace {
 
@@ -51,13 +52,8 @@ TEST(HsDbPolyline, movesThatKeepCirclesCarryEveryVertexAndOthersChangeNothing) {
     const HsGeMatrix3d turnAndShift =
         HsGeMatrix3d::translation({10.0, 20.0, 5.0}) *
         HsGeMatrix3d::rotation(std::numbers::pi / 2, HsGeVector3d::kZAxis);
-    struct Case {
-        const char* what;
-        HsGeMatrix3d xform;
-        double widthFactor;
-        bool refused;
-    };
-    const Case cases[] = {
+    // What the move is, the move, what it does to widths, and whether it is refused.
+    const std::tuple<const char*, HsGeMatrix3d, double, bool> cases[] = {
         {"turn and shift", turnAndShift, 1.0, false},
         {"uniform scale", HsGeMatrix3d::scaling(2.5, {1.0, 1.0, 0.0}), 2.5, false},
         {"mirror", HsGeMatrix3d::scaling(-1.0, 1.0, 1.0), 1.0, false},
@@ -67,15 +63,15 @@ TEST(HsDbPolyline, movesThatKeepCirclesCarryEveryVertexAndOthersChangeNothing) {
     };
     HsDbPolyline original;
     drawRoom(original);
-    for (const Case& c : cases) {
-        SCOPED_TRACE(c.what);
+    for (const auto& [what, xform, widthFactor, refused] : cases) {
+        SCOPED_TRACE(what);
         HsDbPolyline polyline;
         drawRoom(polyline);
-        EXPECT_EQ(polyline.transformBy(c.xform), c.refused ? Hsys::eBadArgument : Hsys::eSuccess);
+        EXPECT_EQ(polyline.transformBy(xform), refused ? Hsys::eBadArgument : Hsys::eSuccess);
         const std::vector<HsGePoint3d> moved = pointsOf(polyline);
         const std::vector<HsGePoint3d> before = pointsOf(original);
         for (std::size_t i = 0; i < moved.size(); ++i) {
-            const HsGePoint3d expected = c.refused ? before[i] : c.xform * before[i];
+            const HsGePoint3d expected = refused ? before[i] : xform * before[i];
             EXPECT_NEAR(moved[i].distanceTo(expected), 0.0, 1e-12) << "vertex " << i;
         }
         double bulge = 0.0;
@@ -84,7 +80,7 @@ TEST(HsDbPolyline, movesThatKeepCirclesCarryEveryVertexAndOthersChangeNothing) {
         polyline.getBulgeAt(2, bulge);
         polyline.getWidthsAt(3, start, end);
         EXPECT_EQ(bulge, 1.0) << "the moved axes carry any mirror";
-        EXPECT_NEAR(start, 0.2 * c.widthFactor, 1e-12);
+        EXPECT_NEAR(start, 0.2 * widthFactor, 1e-12);
         EXPECT_NEAR(polyline.xAxis().length(), 1.0, 1e-12);
     }
 }
@@ -107,25 +103,20 @@ TEST(HsDbPolyline, filesItsPlaneAndVerticesAndRefusesAnImpossiblePlane) {
 
     // Owner, layer, two flags and the origin come before the x axis.
     const std::size_t xAxisAt = 8 + 8 + 1 + 1 + 24;
-    struct Case {
-        const char* what;
-        std::size_t at;
-        std::vector<std::uint8_t> bytes;
-    };
-    const Case cases[] = {
+    const std::tuple<const char*, std::size_t, std::vector<std::uint8_t>> cases[] = {
         {"an x axis of length 2", xAxisAt, {0, 0, 0, 0, 0, 0, 0, 0x40}},
         {"an x axis of NaN", xAxisAt, {0, 0, 0, 0, 0, 0, 0xF8, 0x7F}},
         {"more vertices than bytes", xAxisAt + 48, {0xFF, 0xFF, 0, 0}},
     };
-    for (const Case& c : cases) {
+    for (const auto& [what, at, patch] : cases) {
         std::vector<std::uint8_t> bytes = writer.bytes();
-        std::copy(c.bytes.begin(), c.bytes.end(), bytes.begin() + static_cast<long>(c.at));
+        std::copy(patch.begin(), patch.end(), bytes.begin() + static_cast<long>(at));
         HsDbBdfFiler hostile(bytes, &db);
         HsDbPolyline target;
         drawRoom(target);
-        EXPECT_EQ(target.bdfInFields(&hostile), Hsys::eFilerError) << c.what;
-        EXPECT_EQ(target.numVerts(), 4u) << c.what;
-        EXPECT_EQ(target.xAxis().x, 1.0) << c.what;
+        EXPECT_EQ(target.bdfInFields(&hostile), Hsys::eFilerError) << what;
+        EXPECT_EQ(target.numVerts(), 4u) << what;
+        EXPECT_EQ(target.xAxis().x, 1.0) << what;
     }
 }
 

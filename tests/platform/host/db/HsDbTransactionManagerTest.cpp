@@ -33,10 +33,26 @@ TEST_F(HsDbTransactionTest, aDatabaseWithoutTransactionsHasNoManager) {
 }
 
 TEST_F(HsDbTransactionTest, abortRestoresFieldsErasuresAndRemovesWhatWasAdded) {
-    const HsDbObjectId kept = addGadget(db, L"Wohnen");
+    // Undone objects are told so while their fields come back.
+    struct Watcher : TestGadget {
+        Hsys::ErrorStatus bdfInFields(HsDbBdfFiler* filer) override {
+            sawUndoing = isUndoing();
+            return TestGadget::bdfInFields(filer);
+        }
+        bool sawUndoing = false;
+    };
+    auto* watcher = new Watcher;
+    watcher->label = L"Wohnen";
+    HsDbObjectId kept;
+    {
+        HsDbObjectPointer<HsDbBlockTableRecord> space(db.modelSpaceId(), HsDb::kForWrite);
+        ASSERT_EQ(space->appendHsDbEntity(kept, watcher), Hsys::eSuccess);
+    }
+    watcher->close();
     const HsDbObjectId erased = addGadget(db, L"Bad");
     tm->startTransaction();
     TestGadget* gadget = openForWrite(kept);
+    EXPECT_FALSE(watcher->isUndoing());
     gadget->setLabel(L"Schlafen");
     gadget->setCount(4);
     gadget->setLabel(L"Essen");
@@ -55,6 +71,8 @@ TEST_F(HsDbTransactionTest, abortRestoresFieldsErasuresAndRemovesWhatWasAdded) {
     ASSERT_EQ(restored.openStatus(), Hsys::eSuccess) << "the abort closed it";
     EXPECT_EQ(restored->label, L"Wohnen");
     EXPECT_EQ(restored->count, 0);
+    EXPECT_TRUE(watcher->sawUndoing);
+    EXPECT_FALSE(watcher->isUndoing());
     EXPECT_FALSE(erased.isErased());
     EXPECT_TRUE(added.isErased());
     HsDbObjectPointer<HsDbBlockTableRecord> space(db.modelSpaceId(), HsDb::kForRead);
@@ -98,27 +116,6 @@ TEST_F(HsDbTransactionTest, anInnerAbortUndoesOnlyTheInnerChanges) {
     ASSERT_EQ(tm->endTransaction(), Hsys::eSuccess);
     ASSERT_EQ(tm->abortTransaction(), Hsys::eSuccess);
     EXPECT_EQ(labelOf(id), L"eins") << "the outer abort undoes what the ended inner one did";
-}
-
-TEST_F(HsDbTransactionTest, objectsUndoneAreToldSoWhileTheirFieldsComeBack) {
-    struct Watcher : TestGadget {
-        Hsys::ErrorStatus bdfInFields(HsDbBdfFiler* filer) override {
-            sawUndoing = isUndoing();
-            return TestGadget::bdfInFields(filer);
-        }
-        bool sawUndoing = false;
-    };
-    auto* watcher = new Watcher;
-    HsDbObjectId id;
-    ASSERT_EQ(db.addHsDbObject(id, watcher), Hsys::eSuccess);
-    watcher->close();
-    tm->startTransaction();
-    openForWrite(id)->setCount(9);
-    EXPECT_FALSE(watcher->isUndoing());
-    ASSERT_EQ(tm->abortTransaction(), Hsys::eSuccess);
-    EXPECT_TRUE(watcher->sawUndoing);
-    EXPECT_FALSE(watcher->isUndoing());
-    EXPECT_EQ(watcher->count, 0);
 }
 
 } // namespace

@@ -16,6 +16,7 @@
 #include <fstream>
 #include <map>
 #include <sys/wait.h>
+#include <tuple>
 #include <unistd.h>
 
 namespace {
@@ -65,6 +66,12 @@ protected:
     Hsys::ErrorStatus load(HsDbDatabase& db, std::wstring* reason = nullptr) {
         return db.readDrawingFile(path.wstring().c_str(), reason);
     }
+    // The id that an object saved under the given id has in the loaded database.
+    static HsDbObjectId sameIn(HsDbDatabase& loaded, const HsDbObjectId& saved) {
+        HsDbObjectId found;
+        EXPECT_EQ(loaded.getHsDbObjectId(found, false, saved.handle()), Hsys::eSuccess);
+        return found;
+    }
 
     fs::path directory;
     fs::path path;
@@ -95,21 +102,17 @@ TEST_F(HsDbDrawingFileTest, aSavedDatabaseLoadsWithTheSameObjectsAndReferences) 
     EXPECT_EQ(fs::path(fileName), path);
     EXPECT_EQ(loaded.drawingUnits(), HsDb::kUnitsCentimeters);
     EXPECT_EQ(loaded.displayPrecision(), 3);
-    auto sameIn = [&loaded](const HsDbObjectId& id) {
-        HsDbObjectId found;
-        EXPECT_EQ(loaded.getHsDbObjectId(found, false, id.handle()), Hsys::eSuccess);
-        return found;
-    };
+    const auto idIn = [&loaded](const HsDbObjectId& saved) { return sameIn(loaded, saved); };
     HsDbObjectPointer<HsDbBlockTableRecord> space(loaded.modelSpaceId(), HsDb::kForRead);
     ASSERT_EQ(space.openStatus(), Hsys::eSuccess);
     EXPECT_EQ(space->entityIds(),
-              (std::vector<HsDbObjectId>{sameIn(kitchen), sameIn(hall), sameIn(storeroom)}));
-    EXPECT_TRUE(sameIn(storeroom).isErased());
-    HsDbObjectPointer<TestGadget> gadget(sameIn(kitchen), HsDb::kForRead);
+              (std::vector<HsDbObjectId>{idIn(kitchen), idIn(hall), idIn(storeroom)}));
+    EXPECT_TRUE(idIn(storeroom).isErased());
+    HsDbObjectPointer<TestGadget> gadget(idIn(kitchen), HsDb::kForRead);
     ASSERT_EQ(gadget.openStatus(), Hsys::eSuccess);
-    EXPECT_EQ(gadget->partner, sameIn(hall));
+    EXPECT_EQ(gadget->partner, idIn(hall));
     EXPECT_EQ(gadget->neighbours,
-              (std::vector<HsDbObjectId>{sameIn(hall), sameIn(storeroom), HsDbObjectId()}));
+              (std::vector<HsDbObjectId>{idIn(hall), idIn(storeroom), HsDbObjectId()}));
     EXPECT_EQ(gadget->layerId(), loaded.currentLayerId());
 
     HsDbObjectId added;
@@ -141,16 +144,11 @@ TEST_F(HsDbDrawingFileTest, unknownClassesAndLaterVersionsComeBackByteForByte) {
     HsDbDatabase loaded(HsDb::kEmptyDatabase);
     std::wstring reason;
     ASSERT_EQ(load(loaded, &reason), Hsys::eSuccess) << reason;
-    HsDbObjectId laterId;
-    HsDbObjectId foreignId;
-    loaded.getHsDbObjectId(laterId, false, later.handle());
-    loaded.getHsDbObjectId(foreignId, false, foreign.handle());
-    EXPECT_EQ(HsDbObjectPointer<TestGadget>(laterId, HsDb::kForRead).openStatus(),
-              Hsys::eWrongClass);
     {
-        HsDbObjectPointer<HsDbProxyObject> proxy(laterId, HsDb::kForRead);
+        // A later version of a known class is kept as a proxy, like an unknown class.
+        HsDbObjectPointer<HsDbProxyObject> proxy(sameIn(loaded, later), HsDb::kForRead);
         EXPECT_EQ(proxy.openStatus(), Hsys::eSuccess);
-        proxy.open(foreignId, HsDb::kForRead);
+        proxy.open(sameIn(loaded, foreign), HsDb::kForRead);
         ASSERT_EQ(proxy.openStatus(), Hsys::eSuccess);
         EXPECT_EQ(proxy->originalClassName(), L"ZyrDbFromTheFuture");
         EXPECT_EQ(proxy->ownerId(), loaded.modelSpaceId());
@@ -167,13 +165,9 @@ TEST_F(HsDbDrawingFileTest, damagedAndForeignFilesAreRefusedAndLeaveTheDatabaseE
     const fs::path good = directory / "good.zyr";
     fs::copy_file(path, good);
 
-    struct Case {
-        std::string sql;
-        Hsys::ErrorStatus expected;
-        const wchar_t* because;
-    };
     const std::string row = " WHERE handle = " + std::to_string(gadget.handle());
-    const Case cases[] = {
+    // The damage, the status, and a part of the reason given.
+    const std::tuple<std::string, Hsys::ErrorStatus, const wchar_t*> cases[] = {
         {"UPDATE objects SET data = substr(data, 1, 12)" + row, Hsys::eBadDrawingFile,
          L"cannot be read (eFilerError)"},
         {"UPDATE objects SET data = CAST(data || x'00' AS BLOB)" + row, Hsys::eBadDrawingFile,
@@ -196,15 +190,16 @@ TEST_F(HsDbDrawingFileTest, damagedAndForeignFilesAreRefusedAndLeaveTheDatabaseE
         {"PRAGMA application_id = 1", Hsys::eBadDrawingFile, L"another application"},
         {"DROP TABLE objects", Hsys::eBadDrawingFile, L"no objects"},
     };
-    for (const Case& c : cases) {
+    for (const auto& [sql, expected, because] : cases) {
+        SCOPED_TRACE(sql);
         fs::copy_file(good, path, fs::copy_options::overwrite_existing);
-        executeSql(path, c.sql);
+        executeSql(path, sql);
         HsDbDatabase loaded(HsDb::kEmptyDatabase);
         std::wstring reason;
-        EXPECT_EQ(load(loaded, &reason), c.expected) << c.sql;
-        EXPECT_NE(reason.find(c.because), std::wstring::npos) << c.sql;
-        EXPECT_TRUE(loaded.objectIds().empty()) << c.sql;
-        EXPECT_TRUE(loaded.modelSpaceId().isNull()) << c.sql;
+        EXPECT_EQ(load(loaded, &reason), expected);
+        EXPECT_NE(reason.find(because), std::wstring::npos);
+        EXPECT_TRUE(loaded.objectIds().empty());
+        EXPECT_TRUE(loaded.modelSpaceId().isNull());
     }
 
     std::ofstream(path, std::ios::trunc) << "plain text, no drawing";

@@ -73,28 +73,22 @@ protected:
     TestGadget source;
 };
 
-TEST_F(GadgetStream, everyFieldComesBackAndTheStreamIsUsedUp) {
+TEST_F(GadgetStream, everyFieldComesBackAndEveryTruncationFailsWithoutReadingPastTheEnd) {
     const Bytes full = streamOf(source);
     HsDbBdfFiler reader(full, &db);
     TestGadget copy;
     ASSERT_EQ(copy.bdfInFields(&reader), Hsys::eSuccess);
     EXPECT_EQ(reader.remaining(), 0u);
-    EXPECT_EQ(streamOf(copy), full) << "a field read differently is written differently";
-    EXPECT_EQ(copy.label, source.label);
-    EXPECT_EQ(copy.partner, partner);
-    EXPECT_EQ(copy.child, child);
-    EXPECT_EQ(copy.neighbours, source.neighbours);
-}
+    // With the golden bytes above pinning the writer, an equal stream means equal fields.
+    EXPECT_EQ(streamOf(copy), full);
 
-TEST_F(GadgetStream, everyTruncationFailsWithoutReadingPastTheEnd) {
-    const Bytes full = streamOf(source);
     for (std::size_t length = 0; length < full.size(); ++length) {
         // An exact-size copy, so that the address sanitizer sees any read past the end.
-        HsDbBdfFiler reader(Bytes(full.begin(), full.begin() + static_cast<long>(length)), &db);
-        TestGadget copy;
-        EXPECT_NE(copy.bdfInFields(&reader), Hsys::eSuccess) << "cut at " << length;
-        EXPECT_EQ(reader.filerStatus(), Hsys::eFilerError) << "cut at " << length;
-        EXPECT_LE(reader.position(), length);
+        HsDbBdfFiler cut(Bytes(full.begin(), full.begin() + static_cast<long>(length)), &db);
+        TestGadget target;
+        EXPECT_NE(target.bdfInFields(&cut), Hsys::eSuccess) << "cut at " << length;
+        EXPECT_EQ(cut.filerStatus(), Hsys::eFilerError) << "cut at " << length;
+        EXPECT_LE(cut.position(), length);
     }
 }
 
