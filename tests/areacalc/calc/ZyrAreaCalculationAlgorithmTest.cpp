@@ -16,32 +16,25 @@ TEST_F(ZyrAreaCalculationAlgorithmTest, recordsCarryTheValueOfAnAreaAndZeroForAG
     const HsDbObjectId id = addArea(
         L"Room", profileOf({{{0, 0}, {4, 0}, {4, 3}, {0, 3}}, {{2, 1}, {1, 1}, {1, 2}, {2, 2}}}));
     HsDbObjectPointer<ZyrDbArea> area(id, HsDb::kForRead);
-    using Make = ZyrCalculationNodeData* (
-        ZyrAreaCalculationAlgorithm::*)(HsDbEntity*, const ZyrAreaCalculationBitmapCreator*) const;
+    using Algorithm = ZyrAreaCalculationAlgorithm;
     const ZyrAreaCalculationAreaAlgorithm areaCalc{};
     const ZyrAreaCalculationPerimeterAlgorithm perimeterCalc{};
-    const std::tuple<const ZyrAreaCalculationAlgorithm&, Make, const wchar_t*, const wchar_t*,
-                     const wchar_t*, double>
-        cases[] = {
-            {areaCalc, &ZyrAreaCalculationAlgorithm::areaNodeData,
-             L"ZyrAreaCalculationAreaAlgorithm", L"Area", L"Net area", 11},
-            {areaCalc, &ZyrAreaCalculationAlgorithm::areaGroupNodeData,
-             L"ZyrAreaCalculationAreaAlgorithm", L"Area", L"Net area", 0},
-            {perimeterCalc, &ZyrAreaCalculationAlgorithm::areaNodeData,
-             L"ZyrAreaCalculationPerimeterAlgorithm", L"Perimeter", L"Net perimeter", 18},
-            {perimeterCalc, &ZyrAreaCalculationAlgorithm::areaGroupNodeData,
-             L"ZyrAreaCalculationPerimeterAlgorithm", L"Perimeter", L"Net perimeter", 0},
-        };
-    for (const auto& [algorithm, make, className, grossName, netName, value] : cases) {
-        std::unique_ptr<ZyrCalculationNodeData> data((algorithm.*make)(area.object(), nullptr));
-        EXPECT_EQ(dynamic_cast<ZyrDecomposedCalculationNodeData*>(data.get()), nullptr);
-        EXPECT_EQ(std::tuple(data->objectId, data->algorithmClassName.str(), data->grossName.str(),
-                             data->netName.str()),
-                  std::tuple(id, std::wstring(className), std::wstring(grossName),
-                             std::wstring(netName)));
-        EXPECT_NEAR(data->grossValue, value, 1e-12) << className;
-        EXPECT_EQ(data->netValue, data->grossValue);
-    }
+    const std::tuple<const Algorithm&, const wchar_t*, const wchar_t*, const wchar_t*, double>
+        cases[] = {{areaCalc, L"ZyrAreaCalculationAreaAlgorithm", L"Area", L"Net area", 11},
+                   {perimeterCalc, L"ZyrAreaCalculationPerimeterAlgorithm", L"Perimeter",
+                    L"Net perimeter", 18}};
+    for (const auto& [algorithm, className, grossName, netName, areaValue] : cases)
+        for (const auto& [make, value] : {std::pair(&Algorithm::areaNodeData, areaValue),
+                                          {&Algorithm::areaGroupNodeData, 0.0}}) {
+            std::unique_ptr<ZyrCalculationNodeData> data((algorithm.*make)(area.object(), nullptr));
+            EXPECT_EQ(dynamic_cast<ZyrDecomposedCalculationNodeData*>(data.get()), nullptr);
+            EXPECT_EQ(std::tuple(data->objectId, data->algorithmClassName.str(),
+                                 data->grossName.str(), data->netName.str()),
+                      std::tuple(id, std::wstring(className), std::wstring(grossName),
+                                 std::wstring(netName)));
+            EXPECT_NEAR(data->grossValue, value, 1e-12) << className;
+            EXPECT_EQ(data->netValue, data->grossValue);
+        }
 
     ZyrRmCString areaName;
     ZyrRmCString perimeterName;
@@ -53,12 +46,11 @@ TEST_F(ZyrAreaCalculationAlgorithmTest, recordsCarryTheValueOfAnAreaAndZeroForAG
               ZyrAreaCalculationBaseApp::sStringFromResource(28983, false));
 
     ZyrDesc summary;
-    ZyrAreaCalculationAlgorithm::summaryAlgorithms(&summary,
-                                                   {perimeterAlgorithm(), areaAlgorithm()});
+    Algorithm::summaryAlgorithms(&summary, {perimeterAlgorithm(), areaAlgorithm()});
     EXPECT_EQ(summary.lines(),
               (std::vector<ZyrRmCString>{L"Calculations: Perimeter", L"Calculations: Area"}));
     ZyrDesc none;
-    ZyrAreaCalculationAlgorithm::summaryAlgorithms(&none, {});
+    Algorithm::summaryAlgorithms(&none, {});
     EXPECT_TRUE(none.rows().empty());
 }
 
