@@ -3,6 +3,7 @@
 
 #include "areacalc/calc/ZyrBitmapHandle.h"
 #include "platform/base/res/ZyrRmCString.h"
+#include "platform/base/zyrtl/zyrtlPool.h"
 #include "platform/host/db/HsDbObjectId.h"
 
 #include <cstdint>
@@ -14,6 +15,8 @@ class ZyrAreaCalculationStreamWriter;
 // One pushed object in the tree. Indices, not pointers, bind it to the stream's tables, so that
 // many nodes share one header and pushing never copies a record.
 struct ZyrCalculationNode {
+    ZYRTL_POOLED_RECORD
+
     ZyrCalculationNode* parent = nullptr;
     int headerIndex = 0;
     // Owned; child groups first, then leaf areas.
@@ -24,6 +27,8 @@ struct ZyrCalculationNode {
 
 // What is known of the object itself; at most one per object in a stream.
 struct ZyrCalculationNodeHeader {
+    ZYRTL_POOLED_RECORD
+
     ZyrRmCString className;
     HsDbObjectId objectId;
     ZyrRmCString name;
@@ -43,6 +48,8 @@ struct ZyrModifierBlock {
 // The result of one algorithm on one object. A gross value is the value before modifiers, a net
 // value the value after them.
 struct ZyrCalculationNodeData {
+    ZYRTL_POOLED_RECORD
+
     virtual ~ZyrCalculationNodeData();
 
     HsDbObjectId objectId;
@@ -75,6 +82,8 @@ struct ZyrDecomposedCalculationNodeData : ZyrCalculationNodeData {
 
 // What is known of one modifier object; at most one per modifier in a stream.
 struct ZyrModifierData {
+    ZYRTL_POOLED_RECORD
+
     ZyrRmCString name;
     ZyrRmCString description;
     HsDbObjectId objectId;
