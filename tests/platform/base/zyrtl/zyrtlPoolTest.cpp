@@ -85,9 +85,8 @@ TEST(zyrtlPooledRecord, aDerivedRecordDeletedThroughItsBaseGoesBackToThePoolOfIt
     auto* again = new LargerRecord;
     EXPECT_EQ(static_cast<void*>(again), block);
 
+    // Too large for a pool: made and freed by the global operator new and delete.
     Record* huge = new HugeRecord;
-    huge->value = 2.5;
-    EXPECT_EQ(huge->value, 2.5);
     for (Record* made : {keepBasePoolBusy, static_cast<Record*>(keepLargerPoolBusy), record,
                          static_cast<Record*>(again), huge})
         delete made;
