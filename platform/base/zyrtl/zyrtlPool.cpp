@@ -73,9 +73,7 @@ void BlockPool::startOver() noexcept {
         ::operator delete (m_slabs.back(), std::align_val_t{kAlignment});
         m_slabs.pop_back();
     }
-    // The slabs not reached since the last start are poisoned already.
-    for (std::size_t i = 0; i < m_nextSlab && i < m_slabs.size(); ++i)
-        ASAN_POISON_MEMORY_REGION(m_slabs[i], kSlabSize);
+    // Every block is free now, and so poisoned again, as is every part not cut.
     m_free = nullptr;
     m_nextSlab = 0;
     m_next = nullptr;

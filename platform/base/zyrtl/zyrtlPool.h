@@ -50,7 +50,7 @@ private:
     std::size_t m_inUse = 0;
 };
 
-// A block from the pool of its rounded size, shared by every record and list of that size; sizes
+// A block from the pool of its rounded size, shared by every record of that size; sizes
 // above kLargestPooled go to the global operator new. freeBlock takes the size it was made with.
 constexpr std::size_t kLargestPooled = 256;
 void* allocateBlock(std::size_t size);
